@@ -1,0 +1,32 @@
+#pragma once
+
+#include <stdexcept>
+#include <string>
+
+namespace Trellis {
+namespace Host {
+
+// The host could not be opened: the file is not a host store, was written by
+// a newer version, or cannot be read or created. The text names the file and
+// the problem.
+class HostOpenError : public std::runtime_error {
+public:
+    using std::runtime_error::runtime_error;
+};
+
+// Where the host lives: hostOption (the --host option) when it is not empty,
+// else $HALDEN_HOST, else $XDG_STATE_HOME/halden/host.db, else
+// ~/.local/state/halden/host.db.
+std::string ResolveHostPath(const std::string& hostOption);
+
+// Opens the host at path for this process; a host that does not exist yet is
+// created with the default inventory. Every facade and host object made
+// afterwards works on this host. Opening another host closes the previous one.
+// Throws HostOpenError.
+void OpenHost(const std::string& path);
+
+// Closes the open host, if any.
+void CloseHost();
+
+}  // namespace Host
+}  // namespace Trellis

@@ -1,0 +1,58 @@
+#!/usr/bin/env bash
+# Builds halden-network in ./build, installing the Debian packages it needs
+# first when they are missing. Incremental: when nothing changed since the
+# last successful build of the same scope, it returns at once.
+#
+#   scripts/build.sh tools   haldencli, haldensim and the network plug-in
+#   scripts/build.sh all     everything, tests included
+#
+# All of its own output goes to standard error, so that the wrappers can run
+# it in front of a command whose standard output scripts read.
+set -euo pipefail
+
+scope=${1:-all}
+top=$(cd "$(dirname "${BASH_SOURCE[0]}")/.." && pwd)
+build="$top/build"
+stamp="$build/.built-$scope"
+
+sources_changed() {
+  [ -e "$stamp" ] || return 0
+  [ -n "$(find "$top/CMakeLists.txt" "$top/lib" "$top/plugins" "$top/tools" "$top/tests" "$top/data" \
+            -newer "$stamp" -print -quit 2>/dev/null)" ]
+}
+
+sources_changed || exit 0
+
+# One build at a time: scripts may start many tool invocations at once.
+mkdir -p "$build"
+exec 9>"$build/.lock"
+flock 9
+sources_changed || exit 0
+
+packages=(g++ cmake ninja-build pkg-config libboost-dev libboost-regex-dev
+          libsqlite3-dev nlohmann-json3-dev libgtest-dev)
+missing=()
+for p in "${packages[@]}"; do
+  dpkg-query -W -f='${Status}' "$p" 2>/dev/null | grep -q 'ok installed' || missing+=("$p")
+done
+if [ ${#missing[@]} -gt 0 ]; then
+  echo "Installing ${missing[*]}..." >&2
+  sudo=""
+  [ "$(id -u)" -eq 0 ] || sudo="sudo"
+  export DEBIAN_FRONTEND=noninteractive
+  if ! $sudo apt-get install -y -q "${missing[@]}" >&2; then
+    $sudo apt-get update -q >&2
+    $sudo apt-get install -y -q "${missing[@]}" >&2
+  fi
+fi
+
+if [ ! -f "$build/CMakeCache.txt" ]; then
+  cmake -S "$top" -B "$build" -G Ninja -DCMAKE_BUILD_TYPE=RelWithDebInfo >&2
+fi
+touch "$stamp.new"
+if [ "$scope" = tools ]; then
+  cmake --build "$build" --target haldencli haldensim network >&2
+else
+  cmake --build "$build" >&2
+fi
+mv "$stamp.new" "$stamp"
