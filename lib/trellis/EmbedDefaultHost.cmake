@@ -1,9 +1,9 @@
 # Writes a C++ source that holds the default host description as a string.
 file(READ ${INPUT} DESCRIPTION)
-set(DELIM "halden_default_host")
+set(DELIM "host_json")
 file(WRITE ${OUTPUT}.tmp
 "// Generated from data/default-host.json; do not edit.\n"
-"#include <string>\n"
+""
 "namespace Trellis { namespace Host {\n"
 "extern const char* const kDefaultHostDescription;\n"
 "const char* const kDefaultHostDescription = R\"${DELIM}(${DESCRIPTION})${DELIM}\";\n"

@@ -16,7 +16,8 @@ public:
 
 // Where the host lives: hostOption (the --host option) when it is not empty,
 // else $HALDEN_HOST, else $XDG_STATE_HOME/halden/host.db, else
-// ~/.local/state/halden/host.db.
+// ~/.local/state/halden/host.db. Throws HostOpenError when none of these is
+// set.
 std::string ResolveHostPath(const std::string& hostOption);
 
 // Opens the host at path for this process; a host that does not exist yet is

@@ -1,0 +1,31 @@
+#include <cstdlib>
+
+#include "trellis/host/HostSession.h"
+
+namespace Trellis {
+namespace Host {
+
+namespace {
+
+std::string EnvOrEmpty(const char* name) {
+    const char* value = std::getenv(name);
+    return value ? value : "";
+}
+
+}  // namespace
+
+std::string ResolveHostPath(const std::string& hostOption) {
+    if (!hostOption.empty()) return hostOption;
+    std::string fromEnv = EnvOrEmpty("HALDEN_HOST");
+    if (!fromEnv.empty()) return fromEnv;
+    std::string stateHome = EnvOrEmpty("XDG_STATE_HOME");
+    if (stateHome.empty()) {
+        std::string home = EnvOrEmpty("HOME");
+        if (home.empty()) throw HostOpenError("Cannot locate the host: neither --host, HALDEN_HOST, XDG_STATE_HOME nor HOME is set");
+        stateHome = home + "/.local/state";
+    }
+    return stateHome + "/halden/host.db";
+}
+
+}  // namespace Host
+}  // namespace Trellis

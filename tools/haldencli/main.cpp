@@ -1,0 +1,2 @@
+// Being written: the command-line tool.
+int main() { return 2; }

@@ -1,0 +1,2 @@
+// Being written: the simulator control tool.
+int main() { return 2; }
