@@ -1,0 +1,25 @@
+#include "gantry/network/NicCapabilities.h"
+
+namespace Gantry {
+namespace Network {
+
+NicCapabilities::NicCapabilities()
+    : checksumOffload(false), tcpSegmentationOffload(false), scatterGather(false), vlanTagOffload(false) {}
+
+NicCapabilities NicCapabilities::GetDefaultPolicy() {
+    NicCapabilities capabilities;
+    capabilities.checksumOffload = true;
+    capabilities.tcpSegmentationOffload = true;
+    capabilities.scatterGather = true;
+    capabilities.vlanTagOffload = true;
+    return capabilities;
+}
+
+bool operator==(NicCapabilities const& a, NicCapabilities const& b) {
+    return a.checksumOffload == b.checksumOffload &&
+           a.tcpSegmentationOffload == b.tcpSegmentationOffload &&
+           a.scatterGather == b.scatterGather && a.vlanTagOffload == b.vlanTagOffload;
+}
+
+}  // namespace Network
+}  // namespace Gantry

@@ -1,0 +1,28 @@
+#include "trellis/util/Exec.h"
+
+#include "host/ExecLogTable.h"
+#include "host/Store.h"
+#include "trellis/host/Operation.h"
+
+namespace Trellis {
+namespace Util {
+
+namespace {
+
+const Host::Operation kTrellisExec("Trellis_Exec", Host::FaultKind::Status);
+
+}  // namespace
+
+int Trellis_Exec(std::string const& commandLine, bool option1, bool option2, bool option3) {
+    int status = kTrellisExec.FaultStatus();
+    kTrellisExec.Write([&](Host::Transaction& t) {
+        Host::Store& store = t.GetStore();
+        Host::GuardedSql(store, [&] {
+            Host::AppendExecEntry(store.Db(), {commandLine, {option1, option2, option3}, status});
+        });
+    });
+    return status;
+}
+
+}  // namespace Util
+}  // namespace Trellis
