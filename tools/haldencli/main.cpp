@@ -1,2 +1,32 @@
-// Being written: the command-line tool.
-int main() { return 2; }
+// haldencli: loads the plug-ins and hands the command line to the framework.
+#include <iostream>
+#include <string>
+#include <vector>
+
+#include "plinth/autocli/Namespace.h"
+#include "plinth/cli/PluginLoader.h"
+#include "plinth/cli/Tool.h"
+#include "trellis/host/HostSession.h"
+
+namespace {
+
+void OpenHost(std::string const& hostOption) {
+    Trellis::Host::OpenHost(Trellis::Host::ResolveHostPath(hostOption));
+}
+
+}  // namespace
+
+int main(int argc, char** argv) {
+    boost::shared_ptr<Plinth::AutoCli::NamespaceNode> root = Plinth::AutoCli::Namespace::New();
+    try {
+        std::string const pluginDir = Plinth::Cli::ExecutableDirectory() + "/" + HALDEN_PLUGINDIR_FROM_BIN;
+        Plinth::Cli::LoadPlugins(Plinth::Cli::PluginFiles(pluginDir), root);
+    } catch (Plinth::Cli::PluginLoadError const& failure) {
+        std::cerr << "Error: " << failure.what() << "\n";
+        return Plinth::Cli::EXIT_REFUSED;
+    }
+    Plinth::Cli::Tool tool(root, "haldencli", OpenHost);
+    int const status = tool.Run(std::vector<std::string>(argv + 1, argv + argc), std::cout, std::cerr);
+    std::cout.flush();
+    return status;
+}

@@ -1,0 +1,23 @@
+#pragma once
+
+// Everything a plug-in uses of the command framework.
+#include "plinth/autocli/Command.h"
+#include "plinth/autocli/Namespace.h"
+#include "plinth/autocli/NamespaceNode.h"
+#include "plinth/autocli/PluginEntry.h"
+#include "plinth/callspec/CallTarget.h"
+#include "plinth/callspec/Input.h"
+#include "plinth/callspec/InputSpec.h"
+#include "plinth/callspec/Output.h"
+#include "plinth/callspec/OutputSpec.h"
+#include "plinth/callspec/ParameterConstraint.h"
+#include "plinth/callspec/ParameterConstraintType.h"
+#include "plinth/callspec/ParameterSpec.h"
+#include "plinth/callspec/ParameterType.h"
+#include "plinth/metaobj/MetaBool.h"
+#include "plinth/metaobj/MetaInt.h"
+#include "plinth/metaobj/MetaList.h"
+#include "plinth/metaobj/MetaObject.h"
+#include "plinth/metaobj/MetaString.h"
+#include "plinth/metaobj/MetaStruct.h"
+#include "plinth/metaobj/MetaType.h"

@@ -1,0 +1,56 @@
+#pragma once
+
+#include <functional>
+#include <ostream>
+#include <string>
+#include <vector>
+
+#include <boost/shared_ptr.hpp>
+
+#include "plinth/autocli/Command.h"
+#include "plinth/autocli/NamespaceNode.h"
+#include "plinth/cli/GlobalOptions.h"
+#include "plinth/cli/HelpWriter.h"
+
+namespace Plinth {
+namespace Cli {
+
+// Exit statuses of the tool.
+enum ExitStatus {
+    EXIT_OK = 0,       // the command set no error text (or help was shown)
+    EXIT_FAILED = 1,   // the command set an error text, or threw
+    EXIT_REFUSED = 2,  // refused before running: command line, plug-in or host
+};
+
+// One run of the tool over a loaded tree: global options, path resolution,
+// help, option validation, execution and rendering of the Output.
+class Tool {
+public:
+    // Opens the host that the --host option names ("" when not given). Any
+    // std::exception it throws is a refusal: its text is shown, exit 2.
+    typedef std::function<void(std::string const& hostOption)> HostOpener;
+
+    Tool(boost::shared_ptr<AutoCli::NamespaceNode> root, std::string programName, HostOpener openHost);
+
+    // words: the command line after the program name. Writes the result and
+    // help to out, error texts and refusals to err; returns the exit status.
+    int Run(std::vector<std::string> const& words, std::ostream& out, std::ostream& err);
+
+private:
+    int RunCommand(AutoCli::Command& command, GlobalOptions const& options, std::vector<std::string> const& words,
+                   std::ostream& out, std::ostream& err);
+    int ShowCommandHelp(AutoCli::Command& command, GlobalOptions const& options, std::ostream& out,
+                        std::ostream& err);
+    // The command's input specification. Some commands ask the host for it:
+    // when the first request fails, the host is opened and it is asked again.
+    boost::shared_ptr<CallSpec::InputSpec> InputSpecOf(AutoCli::Command& command, GlobalOptions const& options);
+    void OpenHostOnce(GlobalOptions const& options);
+
+    boost::shared_ptr<AutoCli::NamespaceNode> root_;
+    HelpWriter help_;
+    HostOpener openHost_;
+    bool hostOpen_ = false;
+};
+
+}  // namespace Cli
+}  // namespace Plinth

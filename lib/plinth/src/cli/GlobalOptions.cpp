@@ -1,0 +1,51 @@
+#include "plinth/cli/GlobalOptions.h"
+
+#include "plinth/cli/UsageError.h"
+
+namespace Plinth {
+namespace Cli {
+
+namespace {
+
+// Reads the value of --name or --name=value at words[i]; false when words[i]
+// is neither form.
+bool ReadValueOption(std::string const& name, std::vector<std::string> const& words, size_t& i, std::string& value,
+                     bool& seen) {
+    std::string const& word = words[i];
+    std::string const option = "--" + name;
+    bool const inlineForm = word.compare(0, option.size() + 1, option + "=") == 0;
+    if (word != option && !inlineForm) return false;
+    if (seen) throw UsageError("Option " + option + " was given more than once.");
+    seen = true;
+    if (inlineForm) {
+        value = word.substr(option.size() + 1);
+    } else if (i + 1 < words.size()) {
+        value = words[++i];
+    } else {
+        throw UsageError("Option " + option + " requires a value.");
+    }
+    if (value.empty()) throw UsageError("Option " + option + " requires a value.");
+    return true;
+}
+
+}  // namespace
+
+GlobalOptions ParseGlobalOptions(std::vector<std::string> const& words) {
+    GlobalOptions options;
+    bool hostSeen = false;
+    bool formatterSeen = false;
+    size_t i = 0;
+    for (; i < words.size() && !words[i].empty() && words[i][0] == '-'; ++i) {
+        if (words[i] == "--help") {
+            options.help = true;
+        } else if (!ReadValueOption("host", words, i, options.host, hostSeen) &&
+                   !ReadValueOption("formatter", words, i, options.formatter, formatterSeen)) {
+            throw UsageError("Unknown option " + words[i] + ".");
+        }
+    }
+    options.commandWords.assign(words.begin() + static_cast<long>(i), words.end());
+    return options;
+}
+
+}  // namespace Cli
+}  // namespace Plinth

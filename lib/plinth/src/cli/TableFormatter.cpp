@@ -1,0 +1,54 @@
+#include <algorithm>
+
+#include <boost/algorithm/string/trim.hpp>
+
+#include "plinth/cli/Formatters.h"
+#include "plinth/cli/TableRows.h"
+#include "plinth/cli/ValueText.h"
+#include "plinth/metaobj/MetaBool.h"
+#include "plinth/metaobj/MetaList.h"
+
+namespace Plinth {
+namespace Cli {
+
+using namespace MetaObj;
+
+namespace {
+
+void WriteRow(std::ostream& out, std::vector<std::string> const& cells, std::vector<size_t> const& widths) {
+    std::string line;
+    for (size_t i = 0; i < cells.size(); ++i) {
+        if (i > 0) line += "  ";
+        line += cells[i] + std::string(widths[i] - cells[i].size(), ' ');
+    }
+    out << boost::algorithm::trim_right_copy(line) << "\n";
+}
+
+}  // namespace
+
+void TableFormatter::Write(std::ostream& out, boost::shared_ptr<MetaObject> const& result,
+                           boost::shared_ptr<MetaObject> const& shape, FormatHints const& hints) const {
+    if (result->GetMetaType() == META_BOOL) {
+        MetaBool const& value = static_cast<MetaBool const&>(*result);
+        if (value.IsSet() && !value.GetValue()) out << "false\n";
+        return;
+    }
+    TableRows const table = MakeTableRows(result, shape, hints, true);
+    if (!table.isTable) {
+        for (std::string const& line : table.plainLines) out << line << "\n";
+        return;
+    }
+    std::vector<size_t> widths;
+    for (std::string const& title : table.columns) widths.push_back(title.size());
+    for (auto const& row : table.rows) {
+        for (size_t i = 0; i < row.size(); ++i) widths[i] = std::max(widths[i], row[i].size());
+    }
+    std::vector<std::string> dashes;
+    for (size_t width : widths) dashes.push_back(std::string(width, '-'));
+    WriteRow(out, table.columns, widths);
+    WriteRow(out, dashes, widths);
+    for (auto const& row : table.rows) WriteRow(out, row, widths);
+}
+
+}  // namespace Cli
+}  // namespace Plinth

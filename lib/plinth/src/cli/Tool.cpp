@@ -1,0 +1,156 @@
+#include "plinth/cli/Tool.h"
+
+#include <algorithm>
+#include <list>
+
+#include "plinth/cli/FormatHints.h"
+#include "plinth/cli/Formatter.h"
+#include "plinth/cli/OptionParser.h"
+#include "plinth/cli/UsageError.h"
+
+namespace Plinth {
+namespace Cli {
+
+using AutoCli::Command;
+using AutoCli::NamespaceNode;
+using CallSpec::InputSpec;
+using CallSpec::Output;
+
+namespace {
+
+// A failure of the host opener, told apart from the command's own failures.
+struct HostUnavailable {
+    std::string text;
+};
+
+std::string AvailableFormatters() {
+    std::string names;
+    for (std::string const& name : FormatterNames()) names += (names.empty() ? "" : ", ") + name;
+    return names;
+}
+
+}  // namespace
+
+Tool::Tool(boost::shared_ptr<NamespaceNode> root, std::string programName, HostOpener openHost)
+    : root_(root), help_(std::move(programName)), openHost_(std::move(openHost)) {}
+
+int Tool::Run(std::vector<std::string> const& words, std::ostream& out, std::ostream& err) {
+    GlobalOptions options;
+    try {
+        options = ParseGlobalOptions(words);
+    } catch (UsageError const& refusal) {
+        err << "Error: " << refusal.what() << "\n\n" << help_.NamespaceHelp(*root_);
+        return EXIT_REFUSED;
+    }
+    if (!options.formatter.empty() && !MakeFormatter(options.formatter)) {
+        err << "Error: Unknown formatter '" << options.formatter << "'. Available formatters: " << AvailableFormatters()
+            << ".\n";
+        return EXIT_REFUSED;
+    }
+
+    std::list<std::string> path(options.commandWords.begin(), options.commandWords.end());
+    boost::shared_ptr<NamespaceNode> node = root_->ResolveNode(path);
+    std::vector<std::string> const rest(path.begin(), path.end());
+    bool const helpAsked = options.help || std::find(rest.begin(), rest.end(), "--help") != rest.end();
+
+    boost::shared_ptr<Command> command = boost::dynamic_pointer_cast<Command>(node);
+    if (!command) {
+        if (!rest.empty() && rest.front() != "--help") {
+            std::string const where = node->GetPathString(' ');
+            err << "Error: Unknown command or namespace " << (where.empty() ? "" : where + " ") << rest.front()
+                << ".\n\n"
+                << help_.NamespaceHelp(*node);
+            return EXIT_REFUSED;
+        }
+        out << help_.NamespaceHelp(*node);
+        return EXIT_OK;
+    }
+    try {
+        if (helpAsked) return ShowCommandHelp(*command, options, out, err);
+        return RunCommand(*command, options, rest, out, err);
+    } catch (HostUnavailable const& failure) {
+        err << "Error: " << failure.text << "\n";
+        return EXIT_REFUSED;
+    }
+}
+
+void Tool::OpenHostOnce(GlobalOptions const& options) {
+    if (hostOpen_) return;
+    try {
+        if (openHost_) openHost_(options.host);
+    } catch (std::exception const& failure) {
+        throw HostUnavailable{failure.what()};
+    }
+    hostOpen_ = true;
+}
+
+boost::shared_ptr<InputSpec> Tool::InputSpecOf(Command& command, GlobalOptions const& options) {
+    try {
+        return command.GetInputSpec();
+    } catch (std::exception const&) {
+        if (hostOpen_) throw;
+    }
+    OpenHostOnce(options);
+    return command.GetInputSpec();
+}
+
+int Tool::ShowCommandHelp(Command& command, GlobalOptions const& options, std::ostream& out, std::ostream& err) {
+    // The options of a few commands come from the host; help opens it then.
+    try {
+        InputSpecOf(command, options);
+    } catch (std::exception const& failure) {
+        err << failure.what() << "\n";
+        return EXIT_FAILED;
+    }
+    out << help_.CommandHelp(command);
+    return EXIT_OK;
+}
+
+int Tool::RunCommand(Command& command, GlobalOptions const& options, std::vector<std::string> const& words,
+                     std::ostream& out, std::ostream& err) {
+    boost::shared_ptr<CallSpec::Input> input;
+    try {
+        input = ParseCommandOptions(*InputSpecOf(command, options), words);
+    } catch (UsageError const& refusal) {
+        err << "Error: " << refusal.what() << "\n\n" << help_.CommandHelp(command);
+        return EXIT_REFUSED;
+    } catch (std::exception const& failure) {
+        err << failure.what() << "\n";
+        return EXIT_FAILED;
+    }
+
+    std::string formatterName = options.formatter;
+    if (formatterName.empty()) formatterName = command.GetDefaultOutputFormatter();
+    std::unique_ptr<Formatter> formatter = MakeFormatter(formatterName);
+    if (!formatter) formatter = MakeFormatter("simple");
+
+    OpenHostOnce(options);
+    boost::shared_ptr<Output> output = Output::New();
+    std::string escaped;
+    try {
+        command.Execute(input, output);
+    } catch (std::exception const& failure) {
+        escaped = failure.what();
+    } catch (...) {
+        escaped = "The command failed with an unknown exception.";
+    }
+
+    for (std::string const& text : output->GetErrors()) err << text << "\n";
+    if (!escaped.empty()) {
+        err << escaped << "\n";
+        return EXIT_FAILED;
+    }
+    if (boost::shared_ptr<MetaObj::MetaObject> result = output->GetResult()) {
+        boost::shared_ptr<MetaObj::MetaObject> shape;
+        try {
+            shape = command.GetOutputSpec()->GetResultType();
+        } catch (std::exception const&) {
+            // The shape only names the columns of an empty table.
+        }
+        formatter->Write(out, result, shape, FormatHints(command.GetDefaultOutputFormatParameters()));
+    }
+    return output->HasError() ? EXIT_FAILED : EXIT_OK;
+}
+
+}  // namespace Cli
+}  // namespace Plinth

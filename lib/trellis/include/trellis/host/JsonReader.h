@@ -1,0 +1,91 @@
+#pragma once
+
+// Checked reading of JSON values: every host description and every stored
+// record is read through a JsonReader, so each bad value is refused with the
+// path where it stands, e.g.
+//   firewall.rulesets[2].rules[0].portBegin: expected an integer from 0 to 65535
+
+#include <cstddef>
+#include <cstdint>
+#include <set>
+#include <stdexcept>
+#include <string>
+#include <vector>
+
+#include <nlohmann/json_fwd.hpp>
+
+namespace Trellis {
+namespace Host {
+
+// Every JSON value of the host keeps the order of its members.
+using Json = nlohmann::ordered_json;
+
+// A description or record that cannot be read. The text is "path: problem".
+class DescriptionError : public std::runtime_error {
+public:
+    using std::runtime_error::runtime_error;
+};
+
+class JsonReader {
+public:
+    // value may be null: the reader then stands for a member that is absent.
+    JsonReader(const Json* value, std::string path);
+
+    bool IsPresent() const { return value_ != nullptr; }
+    const std::string& Path() const { return path_; }
+    const Json& Value() const;  // fails when absent
+    [[noreturn]] void Fail(const std::string& problem) const;
+
+    // The reader's own value.
+    void ExpectObject() const;
+    std::string AsString() const;
+    // The elements of an array value; an absent value is an empty array.
+    std::vector<JsonReader> Elements() const;
+
+    // Members of an object value. The forms without a fallback refuse a
+    // missing member; the forms with one return it for a missing member.
+    std::string String(const char* key) const;
+    std::string String(const char* key, const std::string& fallback) const;
+    bool Bool(const char* key) const;
+    bool Bool(const char* key, bool fallback) const;
+    std::int64_t Int(const char* key, std::int64_t min, std::int64_t max) const;
+    std::int64_t Int(const char* key, std::int64_t min, std::int64_t max, std::int64_t fallback) const;
+    // A string that must be one of words; returns its index.
+    std::size_t Word(const char* key, const std::vector<std::string>& words) const;
+    // Word as an enum whose values are the indexes of words:
+    //   Direction d = in.Word<Direction>("direction", kDirectionWords);
+    template <class Enum, std::size_t N>
+    Enum Word(const char* key, const char* const (&words)[N]) const {
+        return static_cast<Enum>(Word(key, std::vector<std::string>(words, words + N)));
+    }
+
+    // A member that may be absent (then the result is not IsPresent()).
+    JsonReader Member(const char* key) const;
+    // A required member that must be an object.
+    JsonReader Object(const char* key) const;
+    // The elements of an array member; an absent member is an empty array.
+    std::vector<JsonReader> Array(const char* key) const;
+    std::vector<std::string> StringArray(const char* key) const;
+
+    // Refuses every member of this object that no call above asked for, so
+    // a misspelt key cannot pass unnoticed. Call it last.
+    void RejectUnknownMembers() const;
+
+private:
+    const Json& Required(const char* key) const;
+    const Json* Find(const char* key) const;
+    std::string PathOf(const std::string& key) const;
+
+    const Json* value_;
+    std::string path_;
+    mutable std::set<std::string> used_;
+};
+
+// The word of an enum value from its table (see JsonReader::Word).
+template <class Enum, std::size_t N>
+const char* WordOf(Enum value, const char* const (&words)[N]) {
+    return words[static_cast<std::size_t>(value)];
+}
+
+}  // namespace Host
+}  // namespace Trellis

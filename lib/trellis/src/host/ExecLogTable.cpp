@@ -1,0 +1,42 @@
+#include "host/ExecLogTable.h"
+
+#include <nlohmann/json.hpp>
+
+#include "host/Sqlite.h"
+#include "host/Store.h"
+#include "trellis/host/Transaction.h"
+
+namespace Trellis {
+namespace Host {
+
+void AppendExecEntry(Database& db, const ExecEntry& entry) {
+    db.Prepare("INSERT INTO exec_log (command_line, options, status) VALUES (?, ?, ?)")
+        .Bind(1, entry.commandLine)
+        .Bind(2, nlohmann::json(entry.options).dump())
+        .Bind(3, entry.status)
+        .Run();
+}
+
+std::vector<ExecEntry> ReadExecEntries(Database& db) {
+    std::vector<ExecEntry> entries;
+    Statement query = db.Prepare("SELECT command_line, options, status FROM exec_log ORDER BY id");
+    while (query.Step()) {
+        ExecEntry entry;
+        entry.commandLine = query.Text(0);
+        entry.options = nlohmann::json::parse(query.Text(1)).get<std::array<bool, 3>>();
+        entry.status = static_cast<int>(query.Int(2));
+        entries.push_back(entry);
+    }
+    return entries;
+}
+
+std::vector<ExecEntry> ReadExecLog() {
+    Store& store = CurrentStore();
+    TransactionScope scope(store, false);
+    std::vector<ExecEntry> entries = GuardedSql(store, [&] { return ReadExecEntries(store.Db()); });
+    scope.Commit();
+    return entries;
+}
+
+}  // namespace Host
+}  // namespace Trellis

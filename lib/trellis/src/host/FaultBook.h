@@ -1,0 +1,50 @@
+#pragma once
+
+#include <cstdint>
+#include <map>
+#include <optional>
+#include <string>
+#include <vector>
+
+#include "trellis/host/Faults.h"
+
+namespace Trellis {
+namespace Host {
+
+class Database;
+
+// The faults table of one store, with a cache of the armed faults so that an
+// operation without a fault costs one PRAGMA data_version: the cache is read
+// again only when another connection has committed since.
+class FaultBook {
+public:
+    explicit FaultBook(Database& db) : db_(db) {}
+
+    // The fault that fires for this call of operation, if one is armed; a
+    // counted fault is counted down in the store, in its own transaction, so
+    // that concurrent processes fire it exactly `remaining` times in all.
+    // Must be called outside a transaction.
+    std::optional<Fault> Hit(const std::string& operation);
+
+    // After this connection changed the faults table by other means.
+    void Reload();
+
+    void Arm(const Fault& fault);
+    void Clear();
+    std::vector<Fault> List();
+
+    // Within a transaction that the caller holds (host descriptions).
+    static std::vector<Fault> Read(Database& db);
+    static void Write(Database& db, const std::vector<Fault>& faults);
+
+private:
+    void RefreshIfChanged();
+
+    Database& db_;
+    bool loaded_ = false;
+    std::int64_t dataVersion_ = 0;
+    std::map<std::string, Fault> armed_;
+};
+
+}  // namespace Host
+}  // namespace Trellis

@@ -1,0 +1,119 @@
+#include "host/Sqlite.h"
+
+#include <sqlite3.h>
+
+namespace Trellis {
+namespace Host {
+
+Database::Database(const std::string& path, Mode mode) {
+    int flags = SQLITE_OPEN_NOMUTEX;
+    switch (mode) {
+        case Mode::ReadOnly: flags |= SQLITE_OPEN_READONLY; break;
+        case Mode::ReadWrite: flags |= SQLITE_OPEN_READWRITE; break;
+        case Mode::ReadWriteCreate: flags |= SQLITE_OPEN_READWRITE | SQLITE_OPEN_CREATE; break;
+    }
+    int rc = sqlite3_open_v2(path.c_str(), &db_, flags, nullptr);
+    if (rc != SQLITE_OK) {
+        std::string message = db_ ? sqlite3_errmsg(db_) : sqlite3_errstr(rc);
+        sqlite3_close_v2(db_);
+        db_ = nullptr;
+        throw SqliteError(rc, message);
+    }
+    sqlite3_extended_result_codes(db_, 1);
+}
+
+Database::~Database() {
+    sqlite3_close_v2(db_);
+}
+
+void Database::Fail(int code, const std::string& what) const {
+    std::string message = sqlite3_errmsg(db_);
+    throw SqliteError(code, what.empty() ? message : what + ": " + message);
+}
+
+void Database::Execute(const std::string& sql) {
+    int rc = sqlite3_exec(db_, sql.c_str(), nullptr, nullptr, nullptr);
+    if (rc != SQLITE_OK) Fail(rc, "");
+}
+
+Statement Database::Prepare(const std::string& sql) {
+    return Statement(*this, sql);
+}
+
+std::int64_t Database::QueryInt(const std::string& sql) {
+    Statement statement(*this, sql);
+    if (!statement.Step()) throw SqliteError(SQLITE_ERROR, "No result from: " + sql);
+    return statement.Int(0);
+}
+
+int Database::Changes() const {
+    return sqlite3_changes(db_);
+}
+
+std::int64_t Database::LastInsertRowId() const {
+    return sqlite3_last_insert_rowid(db_);
+}
+
+bool Database::InTransaction() const {
+    return sqlite3_get_autocommit(db_) == 0;
+}
+
+Statement::Statement(Database& db, const std::string& sql) : db_(&db) {
+    int rc = sqlite3_prepare_v2(db.Handle(), sql.c_str(), static_cast<int>(sql.size()), &stmt_, nullptr);
+    if (rc != SQLITE_OK) db.Fail(rc, "");
+}
+
+Statement::~Statement() {
+    sqlite3_finalize(stmt_);
+}
+
+Statement::Statement(Statement&& other) noexcept : db_(other.db_), stmt_(other.stmt_) {
+    other.stmt_ = nullptr;
+}
+
+Statement& Statement::Bind(int index, const std::string& value) {
+    int rc = sqlite3_bind_text(stmt_, index, value.data(), static_cast<int>(value.size()), SQLITE_TRANSIENT);
+    if (rc != SQLITE_OK) db_->Fail(rc, "");
+    return *this;
+}
+
+Statement& Statement::Bind(int index, std::int64_t value) {
+    int rc = sqlite3_bind_int64(stmt_, index, value);
+    if (rc != SQLITE_OK) db_->Fail(rc, "");
+    return *this;
+}
+
+Statement& Statement::BindNull(int index) {
+    int rc = sqlite3_bind_null(stmt_, index);
+    if (rc != SQLITE_OK) db_->Fail(rc, "");
+    return *this;
+}
+
+bool Statement::Step() {
+    int rc = sqlite3_step(stmt_);
+    if (rc == SQLITE_ROW) return true;
+    if (rc == SQLITE_DONE) return false;
+    db_->Fail(rc, "");
+}
+
+void Statement::Run() {
+    while (Step()) {
+    }
+}
+
+std::string Statement::Text(int column) const {
+    const unsigned char* text = sqlite3_column_text(stmt_, column);
+    int size = sqlite3_column_bytes(stmt_, column);
+    return text ? std::string(reinterpret_cast<const char*>(text), static_cast<std::size_t>(size)) : std::string();
+}
+
+std::int64_t Statement::Int(int column) const {
+    return sqlite3_column_int64(stmt_, column);
+}
+
+bool Statement::IsNull(int column) const {
+    return sqlite3_column_type(stmt_, column) == SQLITE_NULL;
+}
+
+}  // namespace Host
+}  // namespace Trellis

@@ -1,0 +1,89 @@
+#pragma once
+
+// A thin RAII layer over the SQLite C API: one connection, prepared
+// statements with positional binding, and errors as SqliteError.
+
+#include <cstdint>
+#include <optional>
+#include <stdexcept>
+#include <string>
+
+struct sqlite3;
+struct sqlite3_stmt;
+
+namespace Trellis {
+namespace Host {
+
+class SqliteError : public std::runtime_error {
+public:
+    SqliteError(int code, const std::string& message) : std::runtime_error(message), code_(code) {}
+    // The primary result code (SQLITE_BUSY, SQLITE_CORRUPT, SQLITE_NOTADB...).
+    int Code() const { return code_ & 0xff; }
+
+private:
+    int code_;
+};
+
+class Statement;
+
+class Database {
+public:
+    enum class Mode { ReadOnly, ReadWrite, ReadWriteCreate };
+
+    Database(const std::string& path, Mode mode);
+    ~Database();
+    Database(const Database&) = delete;
+    Database& operator=(const Database&) = delete;
+
+    // Runs one or more statements that return no rows of interest.
+    void Execute(const std::string& sql);
+    Statement Prepare(const std::string& sql);
+    // The first column of the first row of a query that returns one integer.
+    std::int64_t QueryInt(const std::string& sql);
+    // Rows changed by the last INSERT, UPDATE or DELETE.
+    int Changes() const;
+    std::int64_t LastInsertRowId() const;
+    bool InTransaction() const;
+    sqlite3* Handle() const { return db_; }
+
+    [[noreturn]] void Fail(int code, const std::string& what) const;
+
+private:
+    sqlite3* db_ = nullptr;
+};
+
+class Statement {
+public:
+    Statement(Database& db, const std::string& sql);
+    ~Statement();
+    Statement(Statement&& other) noexcept;
+    Statement(const Statement&) = delete;
+    Statement& operator=(const Statement&) = delete;
+    Statement& operator=(Statement&&) = delete;
+
+    // Binding is by position, from 1.
+    Statement& Bind(int index, const std::string& value);
+    Statement& Bind(int index, std::int64_t value);
+    Statement& Bind(int index, int value) { return Bind(index, static_cast<std::int64_t>(value)); }
+    Statement& BindNull(int index);
+    template <class T>
+    Statement& Bind(int index, const std::optional<T>& value) {
+        return value ? Bind(index, *value) : BindNull(index);
+    }
+
+    // Advances to the next row; false when there is none left.
+    bool Step();
+    // Runs a statement that returns no rows.
+    void Run();
+
+    std::string Text(int column) const;
+    std::int64_t Int(int column) const;
+    bool IsNull(int column) const;
+
+private:
+    Database* db_;
+    sqlite3_stmt* stmt_ = nullptr;
+};
+
+}  // namespace Host
+}  // namespace Trellis

@@ -1,0 +1,91 @@
+#include "host/Store.h"
+
+#include <filesystem>
+
+#include <sqlite3.h>
+
+#include "host/Schema.h"
+#include "trellis/host/HostSession.h"
+#include "trellis/host/Transaction.h"
+
+namespace Trellis {
+namespace Host {
+
+namespace {
+
+constexpr int kBusyTimeoutMs = 10000;
+
+[[noreturn]] void Refuse(const std::string& path, const std::string& problem) {
+    throw HostOpenError("Cannot open the host " + path + ": " + problem);
+}
+
+std::string Describe(const SqliteError& e) {
+    switch (e.Code()) {
+        case SQLITE_NOTADB: return "it is not a host store (" + std::string(e.what()) + ")";
+        case SQLITE_CORRUPT: return "the host store is damaged (" + std::string(e.what()) + ")";
+        default: return e.what();
+    }
+}
+
+// Only reads, so that a file that is refused is left as it was.
+void CheckIsHostStore(const std::string& path, Database& db) {
+    if (db.QueryInt("PRAGMA application_id") != kHostApplicationId) Refuse(path, "it is not a host store");
+    std::int64_t version = db.QueryInt("PRAGMA user_version");
+    if (version < 1) Refuse(path, "it is not a host store (no schema version)");
+    if (version > LatestSchemaVersion())
+        Refuse(path, "it was written by a newer version (schema " + std::to_string(version) +
+                         ", this build knows up to " + std::to_string(LatestSchemaVersion()) + ")");
+    for (const char* table : BaseTables()) {
+        Statement query = db.Prepare("SELECT 1 FROM sqlite_master WHERE type = 'table' AND name = ?");
+        query.Bind(1, table);
+        if (!query.Step()) Refuse(path, std::string("the host store is damaged (table ") + table + " is missing)");
+    }
+}
+
+}  // namespace
+
+Store::Store(std::string path, std::unique_ptr<Database> db)
+    : path_(std::move(path)), db_(std::move(db)), faults_(*db_) {}
+
+std::unique_ptr<Store> Store::Open(const std::string& path) {
+    std::error_code error;
+    if (!std::filesystem::exists(path, error)) CreateHostFile(path);
+    std::unique_ptr<Database> db;
+    try {
+        db = std::make_unique<Database>(path, Database::Mode::ReadWrite);
+    } catch (const SqliteError& e) {
+        Refuse(path, e.what());
+    }
+    std::unique_ptr<Store> store;
+    try {
+        db->Execute("PRAGMA busy_timeout = " + std::to_string(kBusyTimeoutMs));
+        CheckIsHostStore(path, *db);
+        db->Execute("PRAGMA journal_mode = WAL; PRAGMA synchronous = FULL");
+        store = std::make_unique<Store>(path, std::move(db));
+        store->Migrate();
+        store->faults_.Reload();
+    } catch (const SqliteError& e) {
+        Refuse(path, Describe(e));
+    } catch (const Gantry::Lib::GantryException& e) {
+        Refuse(path, e.what());
+    } catch (const DescriptionError& e) {
+        Refuse(path, std::string("its migration failed: ") + e.what());
+    }
+    return store;
+}
+
+void Store::Migrate() {
+    if (db_->QueryInt("PRAGMA user_version") == LatestSchemaVersion()) return;
+    TransactionScope scope(*this, true);
+    // Read again under the write lock: another process may have migrated meanwhile.
+    std::int64_t version = db_->QueryInt("PRAGMA user_version");
+    for (const Migration& step : Migrations()) {
+        if (step.version <= version) continue;
+        step.apply(scope.Get());
+        db_->Execute("PRAGMA user_version = " + std::to_string(step.version));
+    }
+    scope.Commit();
+}
+
+}  // namespace Host
+}  // namespace Trellis

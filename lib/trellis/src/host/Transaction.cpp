@@ -1,0 +1,123 @@
+#include "trellis/host/Transaction.h"
+
+#include <stdexcept>
+
+#include "host/Sqlite.h"
+#include "host/Store.h"
+
+namespace Trellis {
+namespace Host {
+
+namespace {
+
+Json ParseStored(const std::string& text) {
+    return Json::parse(text);
+}
+
+}  // namespace
+
+void Transaction::MissingRecord(const std::string& kind, const std::string& name) {
+    throw Gantry::Lib::GantryException("No " + kind + " \"" + name + "\" on the host");
+}
+
+void Transaction::RequireWrite() const {
+    if (!write_) throw std::logic_error("A change to the host inside a read-only operation");
+}
+
+std::optional<Json> Transaction::FindData(const std::string& kind, const std::string& name) const {
+    return GuardedSql(store_, [&]() -> std::optional<Json> {
+        Statement query = store_.Db().Prepare("SELECT data FROM records WHERE kind = ? AND name = ?");
+        query.Bind(1, kind).Bind(2, name);
+        if (!query.Step()) return std::nullopt;
+        return ParseStored(query.Text(0));
+    });
+}
+
+std::vector<std::pair<std::string, Json>> Transaction::ListData(const std::string& kind) const {
+    return GuardedSql(store_, [&] {
+        std::vector<std::pair<std::string, Json>> records;
+        Statement query = store_.Db().Prepare("SELECT name, data FROM records WHERE kind = ? ORDER BY rowid");
+        query.Bind(1, kind);
+        while (query.Step()) records.emplace_back(query.Text(0), ParseStored(query.Text(1)));
+        return records;
+    });
+}
+
+std::vector<std::string> Transaction::NamesOf(const std::string& kind) const {
+    return GuardedSql(store_, [&] {
+        std::vector<std::string> names;
+        Statement query = store_.Db().Prepare("SELECT name FROM records WHERE kind = ? ORDER BY rowid");
+        query.Bind(1, kind);
+        while (query.Step()) names.push_back(query.Text(0));
+        return names;
+    });
+}
+
+bool Transaction::ContainsData(const std::string& kind, const std::string& name) const {
+    return GuardedSql(store_, [&] {
+        Statement query = store_.Db().Prepare("SELECT 1 FROM records WHERE kind = ? AND name = ?");
+        query.Bind(1, kind).Bind(2, name);
+        return query.Step();
+    });
+}
+
+std::size_t Transaction::CountOf(const std::string& kind) const {
+    return GuardedSql(store_, [&] {
+        Statement query = store_.Db().Prepare("SELECT count(*) FROM records WHERE kind = ?");
+        query.Bind(1, kind);
+        query.Step();
+        return static_cast<std::size_t>(query.Int(0));
+    });
+}
+
+void Transaction::PutData(const std::string& kind, const std::string& name, const Json& data) {
+    RequireWrite();
+    GuardedSql(store_, [&] {
+        // An upsert keeps the rowid, and so the record's place in its list.
+        store_.Db()
+            .Prepare("INSERT INTO records (kind, name, data) VALUES (?, ?, ?)"
+                     " ON CONFLICT (kind, name) DO UPDATE SET data = excluded.data")
+            .Bind(1, kind)
+            .Bind(2, name)
+            .Bind(3, data.dump())
+            .Run();
+    });
+}
+
+bool Transaction::EraseData(const std::string& kind, const std::string& name) {
+    RequireWrite();
+    return GuardedSql(store_, [&] {
+        store_.Db().Prepare("DELETE FROM records WHERE kind = ? AND name = ?").Bind(1, kind).Bind(2, name).Run();
+        return store_.Db().Changes() > 0;
+    });
+}
+
+void Transaction::EraseKind(const std::string& kind) {
+    RequireWrite();
+    GuardedSql(store_, [&] { store_.Db().Prepare("DELETE FROM records WHERE kind = ?").Bind(1, kind).Run(); });
+}
+
+TransactionScope::TransactionScope(Store& store, bool write) : transaction_(store, write) {
+    if (store.InTransaction())
+        throw std::logic_error("A host operation started inside another one; operations do not nest");
+    GuardedSql(store, [&] { store.Db().Execute(write ? "BEGIN IMMEDIATE" : "BEGIN"); });
+    open_ = true;
+}
+
+TransactionScope::~TransactionScope() {
+    if (!open_) return;
+    try {
+        transaction_.GetStore().Db().Execute("ROLLBACK");
+    } catch (...) {
+        // The connection rolled back by itself (e.g. after an I/O error).
+    }
+}
+
+void TransactionScope::Commit() {
+    Store& store = transaction_.GetStore();
+    GuardedSql(store, [&] { store.Db().Execute("COMMIT"); });
+    open_ = false;
+}
+
+}  // namespace Host
+}  // namespace Trellis

@@ -1,0 +1,134 @@
+// Host descriptions: the round trip, the refusal of bad ones, replacement.
+
+#include <gtest/gtest.h>
+
+#include "TempHost.h"
+#include "trellis/host/Description.h"
+#include "trellis/host/Faults.h"
+
+using namespace Trellis::Host;
+using Json = TempHost::Json;
+
+namespace {
+
+std::string RefusalOf(const std::string& description) {
+    try {
+        ImportHost(description);
+    } catch (const DescriptionError& e) {
+        return e.what();
+    }
+    return "";
+}
+
+std::string Edited(const std::function<void(Json&)>& edit) {
+    return TempHost::Edited(edit);
+}
+
+}  // namespace
+
+TEST(HostDescription, ExportAfterImportGivesTheSameDocument) {
+    TempHost host;
+    // The default host exports exactly as data/default-host.json is written.
+    EXPECT_EQ(ExportHost(), kDefaultHostDescription);
+
+    // Every kind of content, including faults and the exec log.
+    std::string busy = Edited([](Json& d) {
+        d["modules"].push_back({{"name", "vmknet"}, {"loaded", false}, {"options", "debug=1"}});
+        d["firewall"]["enabled"] = false;
+        d["firewall"]["defaultAction"] = "PASS";
+        d["firewall"]["rulesetsLoaded"] = false;
+        d["firewall"]["rulesets"][5]["allowedIps"]["ipv6Networks"].push_back("2001:db8::/32");
+        d["firewall"]["dynamicRules"].push_back({{"name", "dyn-1"}, {"portType", "src"}, {"portBegin", 0},
+                                                 {"portEnd", 65535}, {"direction", "outbound"}, {"protocol", "udp"}});
+        d["faults"] = Json::array({Json{{"operation", "Trellis_Exec"}, {"status", -1}, {"remaining", 2}}});
+        d["exec"] = Json::array({Json{{"commandLine", "/etc/init.d/xfrd restart"},
+                                      {"options", {false, true, false}},
+                                      {"status", 0}}});
+    });
+    ImportHost(busy);
+    EXPECT_EQ(ExportHost(), Json::parse(busy).dump(2) + "\n");
+    std::string exported = ExportHost();
+    ImportHost(exported);
+    EXPECT_EQ(ExportHost(), exported);
+}
+
+TEST(HostDescription, BadDescriptionsAreRefusedWithTheirPathAndChangeNothing) {
+    TempHost host([](Json& d) {
+        d["exec"].push_back({{"commandLine", "/etc/init.d/xfrd restart"}, {"options", {false, true, false}}, {"status", 1}});
+    });
+    ArmFault({"Trellis_Exec", "", 4, {}});
+    const std::string before = ExportHost();
+    ASSERT_NE(before.find("xfrd"), std::string::npos);
+
+    struct Case {
+        std::function<void(Json&)> edit;
+        std::string refusal;
+    };
+    const std::vector<Case> cases = {
+        {[](Json& d) { d["format"] = 2; }, "format: expected 1, the format this version reads"},
+        {[](Json& d) { d.erase("format"); }, "format: missing required field"},
+        {[](Json& d) { d["switchez"] = Json::array(); }, "switchez: unknown field"},
+        {[](Json& d) { d["modules"] = Json::object(); }, "modules: expected an array"},
+        {[](Json& d) { d["modules"][0]["loaded"] = "yes"; }, "modules[0].loaded: expected true or false"},
+        {[](Json& d) { d["modules"].push_back(d["modules"][0]); }, "modules[1].name: duplicate module \"haldenfw\""},
+        {[](Json& d) { d["firewall"].erase("enabled"); }, "firewall.enabled: missing required field"},
+        {[](Json& d) { d["firewall"]["defaultAction"] = "drop"; },
+         "firewall.defaultAction: expected \"DROP\" or \"PASS\""},
+        {[](Json& d) { d["firewall"]["rulesets"][2]["rules"][0]["portBegin"] = 65536; },
+         "firewall.rulesets[2].rules[0].portBegin: expected an integer from 0 to 65535"},
+        {[](Json& d) { d["firewall"]["rulesets"][2]["rules"][0]["portBegin"] = 67.0; },
+         "firewall.rulesets[2].rules[0].portBegin: expected an integer from 0 to 65535"},
+        {[](Json& d) { d["firewall"]["rulesets"][2]["rules"][1]["portEnd"] = 66; },
+         "firewall.rulesets[2].rules[1].portEnd: expected a port not below portBegin (67)"},
+        {[](Json& d) { d["firewall"]["rulesets"][0]["rules"][0]["direction"] = "in"; },
+         "firewall.rulesets[0].rules[0].direction: expected \"inbound\" or \"outbound\""},
+        {[](Json& d) { d["firewall"]["rulesets"][0]["rules"][0]["protocol"] = "TCP"; },
+         "firewall.rulesets[0].rules[0].protocol: expected \"tcp\" or \"udp\""},
+        {[](Json& d) { d["firewall"]["rulesets"][0]["rules"][0]["colour"] = "red"; },
+         "firewall.rulesets[0].rules[0].colour: unknown field"},
+        {[](Json& d) { d["firewall"]["rulesets"][3]["name"] = "dhcp"; },
+         "firewall.rulesets[3].name: duplicate ruleset \"dhcp\""},
+        {[](Json& d) { d["firewall"]["rulesets"][5]["allowedIps"]["ipv4Addresses"][0] = "192.0.2.010"; },
+         "firewall.rulesets[5].allowedIps.ipv4Addresses[0]: expected an IPv4 address in canonical form, such as "
+         "\"192.0.2.1\""},
+        {[](Json& d) { d["firewall"]["rulesets"][5]["allowedIps"]["ipv6Networks"][0] = "2001:DB8:100::/48"; },
+         "firewall.rulesets[5].allowedIps.ipv6Networks[0]: expected an IPv6 network in canonical form, such as "
+         "\"2001:db8::/32\""},
+        {[](Json& d) { d["firewall"]["rulesets"][5]["allowedIps"]["ipv4Networks"][0] = "198.51.100.0/33"; },
+         "firewall.rulesets[5].allowedIps.ipv4Networks[0]: expected an IPv4 network in canonical form, such as "
+         "\"192.0.2.0/24\""},
+        {[](Json& d) { d["firewall"]["rulesets"][5]["allowedIps"]["ipv4Addresses"][1] = "192.0.2.10"; },
+         "firewall.rulesets[5].allowedIps.ipv4Addresses[1]: duplicate entry \"192.0.2.10\""},
+        {[](Json& d) { d["faults"] = Json::array({Json{{"operation", "Nope::Nope"}, {"message", "x"}}}); },
+         "faults[0].operation: unknown operation \"Nope::Nope\""},
+        {[](Json& d) { d["faults"] = Json::array({Json{{"operation", "Trellis_Exec"}, {"message", "x"}}}); },
+         "faults[0].status: missing required field"},
+        {[](Json& d) {
+             d["faults"] = Json::array({Json{{"operation", "Trellis_Exec"}, {"status", 1}, {"remaining", 0}}});
+         },
+         "faults[0].remaining: expected an integer from 1 to 2147483647"},
+        {[](Json& d) { d["exec"] = Json::array({Json{{"commandLine", "x"}, {"options", {true}}, {"status", 0}}}); },
+         "exec[0].options: expected three flags"},
+    };
+    for (const Case& c : cases) {
+        std::string description = Edited(c.edit);
+        SCOPED_TRACE(description);
+        EXPECT_EQ(RefusalOf(description), c.refusal);
+    }
+    EXPECT_EQ(RefusalOf("{\"format\": 1,\n  \"modules\": [}"),
+              "not valid JSON: parse error at line 2, column 15: syntax error while parsing value - "
+              "unexpected '}'; expected '[', '{', or a literal");
+    EXPECT_EQ(RefusalOf("[]"), "top level: expected an object");
+    EXPECT_EQ(ExportHost(), before);
+}
+
+TEST(HostDescription, ImportReplacesTheWholeHost) {
+    TempHost host;
+    ArmFault({"Trellis_Exec", "", 4, {}});
+    ImportHost("{\"format\": 1}");
+    Json empty = Json::parse(ExportHost());
+    EXPECT_EQ(empty, Json::parse(R"({"format": 1, "modules": [],
+        "firewall": {"enabled": false, "defaultAction": "PASS", "rulesetsLoaded": false, "rulesets": [], "dynamicRules": []},
+        "faults": [], "exec": []})"));
+    EXPECT_TRUE(ListFaults().empty());  // the faults were replaced too, and this process knows it
+}

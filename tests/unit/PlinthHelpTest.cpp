@@ -1,0 +1,134 @@
+// Help texts: namespace listings, command options, enum markers, wrapping.
+#include <gtest/gtest.h>
+
+#include <sstream>
+
+#include "PlinthScriptedCommand.h"
+#include "plinth/cli/HelpWriter.h"
+#include "plinth/cli/TextLayout.h"
+
+using namespace Plinth::AutoCli;
+using namespace Plinth::CallSpec;
+using Plinth::Cli::HelpWriter;
+using PlinthTest::MakeParameter;
+using PlinthTest::ScriptedCommand;
+
+namespace {
+
+std::vector<std::string> Lines(std::string const& text) {
+    std::vector<std::string> lines;
+    std::istringstream stream(text);
+    for (std::string line; std::getline(stream, line);) lines.push_back(line);
+    return lines;
+}
+
+boost::shared_ptr<ParameterSpec> WithEnum(std::string const& help) {
+    boost::shared_ptr<ParameterSpec> type = MakeParameter("type", PARAMETER_STRING, "t", help, true);
+    boost::shared_ptr<ParameterConstraint> types = ParameterConstraint::New(CONSTRAINT_STRING_ENUM);
+    types->AddStringEnum("static", "Set Static IPv4 information for this interface.");
+    types->AddStringEnum("dhcp", "Use DHCP to aquire IPv4 setting for this interface.");
+    types->AddStringEnum("none", "");
+    type->SetConstraint(types);
+    return type;
+}
+
+}  // namespace
+
+TEST(PlinthHelp, OptionSignaturesByType) {
+    EXPECT_EQ("-r|--ruleset-id=<str>", HelpWriter::OptionSignature(*MakeParameter("ruleset-id", PARAMETER_STRING, "r")));
+    EXPECT_EQ("-p|--ports=<long>", HelpWriter::OptionSignature(*MakeParameter("ports", PARAMETER_INT, "p")));
+    EXPECT_EQ("--enabled=<bool>", HelpWriter::OptionSignature(*MakeParameter("enabled", PARAMETER_BOOL)));
+    EXPECT_EQ("-a|--all", HelpWriter::OptionSignature(*MakeParameter("all", PARAMETER_FLAG, "a")));
+}
+
+TEST(PlinthHelp, EnumMarkersExpandFromTheConstraint) {
+    EXPECT_EQ("IP version : [static, dhcp, none] (required)",
+              HelpWriter::OptionText(*WithEnum("IP version : %ENUM%")));
+    EXPECT_EQ("IPv4 Address type :\n"
+              "  static: Set Static IPv4 information for this interface.\n"
+              "  dhcp: Use DHCP to aquire IPv4 setting for this interface.\n"
+              "  none (required)",
+              HelpWriter::OptionText(*WithEnum("IPv4 Address type : %FULLENUM%")));
+
+    boost::shared_ptr<ParameterSpec> speed = MakeParameter("speed", PARAMETER_INT, "S", "Acceptable values are :%ENUM%");
+    boost::shared_ptr<ParameterConstraint> speeds = ParameterConstraint::New(CONSTRAINT_INT_ENUM);
+    speeds->AddIntEnum(10);
+    speeds->AddIntEnum(100);
+    speed->SetConstraint(speeds);
+    EXPECT_EQ("Acceptable values are :[10, 100]", HelpWriter::OptionText(*speed));
+}
+
+TEST(PlinthHelp, CommandHelpLayout) {
+    boost::shared_ptr<Namespace> root = Namespace::New();
+    boost::shared_ptr<ScriptedCommand> set = ScriptedCommand::New("Set firewall ruleset status.");
+    root->SubNamespace("network")->SubNamespace("firewall")->RegisterNamespaceNode(set, "set");
+    set->inputSpec = [] {
+        boost::shared_ptr<InputSpec> spec = InputSpec::New();
+        spec->AddParameter(MakeParameter("enabled", PARAMETER_BOOL, "e",
+                                         "Set to true to enable ruleset, set to false to disable it. This text is "
+                                         "long enough to wrap onto a second line."));
+        spec->AddParameter(MakeParameter("ruleset-id", PARAMETER_STRING, "r", "The label of the ruleset.", true));
+        spec->AddParameter(MakeParameter("override-vswitch-allow-promiscuous", PARAMETER_BOOL, "",
+                                         "Too wide for the column."));
+        spec->AddParameter(MakeParameter("all", PARAMETER_FLAG, "a", ""));
+        return spec;
+    };
+    EXPECT_EQ((std::vector<std::string>{
+                  "Usage: haldencli network firewall set [cmd options]",
+                  "",
+                  "Description:",
+                  "  Set firewall ruleset status.",
+                  "",
+                  "Cmd options:",
+                  "  -e|--enabled=<bool>   Set to true to enable ruleset, set to false to disable",
+                  "                        it. This text is long enough to wrap onto a second line.",
+                  "  -r|--ruleset-id=<str> The label of the ruleset. (required)",
+                  "  --override-vswitch-allow-promiscuous=<bool>",
+                  "                        Too wide for the column.",
+                  "  -a|--all",
+              }),
+              Lines(HelpWriter("haldencli").CommandHelp(*set)));
+}
+
+TEST(PlinthHelp, NamespaceHelpListsNamespacesThenCommandsInRegistrationOrder) {
+    boost::shared_ptr<Namespace> root = Namespace::New();
+    boost::shared_ptr<NamespaceNode> firewall = root->SubNamespace("network")->SubNamespace("firewall");
+    firewall->SetDescription("A set of commands for firewall related operations");
+    firewall->RegisterNamespaceNode(ScriptedCommand::New("Get the firewall status."), "get");
+    firewall->SubNamespace("ruleset")->SetDescription("Commands to list and update firewall ruleset configuration");
+    firewall->RegisterNamespaceNode(ScriptedCommand::New("Set the firewall."), "set");
+
+    EXPECT_EQ((std::vector<std::string>{
+                  "Usage: haldencli [options] {namespace}+ {cmd} [cmd options]",
+                  "",
+                  "A set of commands for firewall related operations",
+                  "",
+                  "Available Namespaces:",
+                  "  ruleset  Commands to list and update firewall ruleset configuration",
+                  "",
+                  "Available Commands:",
+                  "  get  Get the firewall status.",
+                  "  set  Set the firewall.",
+              }),
+              Lines(HelpWriter("haldencli").NamespaceHelp(*firewall)));
+
+    std::string const rootHelp = HelpWriter("haldencli").NamespaceHelp(*root);
+    EXPECT_NE(std::string::npos, rootHelp.find("\nOptions:\n  --formatter=<str>"));
+    EXPECT_NE(std::string::npos, rootHelp.find("\nAvailable Namespaces:\n  network\n"));
+}
+
+TEST(PlinthTextLayout, WrapsAtBlanksAndKeepsLongWordsWhole) {
+    EXPECT_EQ((std::vector<std::string>{"one two", "three"}), Plinth::Cli::WrapText("one two three", 8));
+    EXPECT_EQ((std::vector<std::string>{"a", "averyveryverylongword", "b"}),
+              Plinth::Cli::WrapText("a averyveryverylongword b", 8));
+    EXPECT_EQ((std::vector<std::string>{"x:", "  aa bb", "  cc"}), Plinth::Cli::WrapText("x:\n  aa bb cc", 7));
+    for (std::string const& line : Lines(Plinth::Cli::FormatColumns(
+             "--x", std::string(300, 'w') + " " + std::string(30, 'y') + " z", 2, 24, 80))) {
+        EXPECT_TRUE(line.size() <= 80 || line.find(' ', 24) == std::string::npos) << line;
+    }
+}
+
+TEST(PlinthTextLayout, KeepsTheBlanksOfTheHelpTextWithinALine) {
+    EXPECT_EQ((std::vector<std::string>{"listed  by name"}), Plinth::Cli::WrapText("listed  by name", 40));
+    EXPECT_EQ((std::vector<std::string>{"listed", "by name"}), Plinth::Cli::WrapText("listed  by name", 8));
+}

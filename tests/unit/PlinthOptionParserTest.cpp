@@ -1,0 +1,158 @@
+// Command options: the accepted forms, the types and each constraint kind at
+// and beyond its bounds, and the refusals.
+#include <gtest/gtest.h>
+
+#include "PlinthScriptedCommand.h"
+#include "plinth/cli/OptionParser.h"
+#include "plinth/cli/UsageError.h"
+#include "plinth/cli/ValueParser.h"
+
+using namespace Plinth::CallSpec;
+using Plinth::Cli::ParseCommandOptions;
+using Plinth::Cli::UsageError;
+using PlinthTest::MakeParameter;
+
+namespace {
+
+boost::shared_ptr<ParameterSpec> Constrained(std::string const& name, ParameterType type,
+                                             boost::shared_ptr<ParameterConstraint> constraint) {
+    boost::shared_ptr<ParameterSpec> parameter = ParameterSpec::New(name, type);
+    parameter->SetConstraint(constraint);
+    return parameter;
+}
+
+boost::shared_ptr<InputSpec> Spec() {
+    boost::shared_ptr<InputSpec> spec = InputSpec::New();
+    spec->AddParameter(MakeParameter("name", PARAMETER_STRING, "n"));
+    spec->AddParameter(MakeParameter("count", PARAMETER_INT, "c"));
+    spec->AddParameter(MakeParameter("enabled", PARAMETER_BOOL, "e"));
+    spec->AddParameter(MakeParameter("verbose", PARAMETER_FLAG, "v"));
+
+    boost::shared_ptr<ParameterConstraint> range = ParameterConstraint::New(CONSTRAINT_INT_RANGE);
+    range->SetIntRange(1, 4096);
+    spec->AddParameter(Constrained("ports", PARAMETER_INT, range));
+    boost::shared_ptr<ParameterConstraint> speeds = ParameterConstraint::New(CONSTRAINT_INT_ENUM);
+    speeds->AddIntEnum(10);
+    speeds->AddIntEnum(100);
+    spec->AddParameter(Constrained("speed", PARAMETER_INT, speeds));
+    boost::shared_ptr<ParameterConstraint> types = ParameterConstraint::New(CONSTRAINT_STRING_ENUM);
+    types->AddStringEnum("static", "");
+    types->AddStringEnum("dhcp", "");
+    spec->AddParameter(Constrained("type", PARAMETER_STRING, types));
+    boost::shared_ptr<ParameterConstraint> pattern = ParameterConstraint::New(CONSTRAINT_STRING_REGEX);
+    pattern->SetStringRegex("tsl[0-9]+");
+    spec->AddParameter(Constrained("interface", PARAMETER_STRING, pattern));
+    return spec;
+}
+
+boost::shared_ptr<Input> Parse(std::vector<std::string> const& words) { return ParseCommandOptions(*Spec(), words); }
+
+// The refusal text for words, or "" when they are accepted.
+std::string Refusal(std::vector<std::string> const& words) {
+    try {
+        Parse(words);
+    } catch (UsageError const& refusal) {
+        return refusal.what();
+    }
+    return "";
+}
+
+}  // namespace
+
+TEST(PlinthOptionParser, LongShortAndInlineFormsAllReachTheInput) {
+    boost::shared_ptr<Input> input =
+        Parse({"--name", "pnet0", "-c", "-5", "--enabled=YES", "-v", "--type=dhcp", "--interface", "tsl12"});
+    EXPECT_EQ("pnet0", input->GetString("name"));
+    EXPECT_EQ(-5, input->GetInt("count"));
+    EXPECT_TRUE(input->GetBool("enabled"));
+    EXPECT_TRUE(input->GetFlag("verbose"));
+    EXPECT_EQ("dhcp", input->GetString("type"));
+    EXPECT_EQ("tsl12", input->GetString("interface"));
+    EXPECT_FALSE(input->HasParameter("ports"));
+
+    // A value may contain '=' and may start with '-' in the inline form.
+    input = Parse({"-n=a=b", "--count=+7"});
+    EXPECT_EQ("a=b", input->GetString("name"));
+    EXPECT_EQ(7, input->GetInt("count"));
+    EXPECT_EQ("-x", Parse({"--name=-x"})->GetString("name"));
+    EXPECT_EQ("", Parse({"--name="})->GetString("name"));
+    EXPECT_TRUE(Parse({"--name="})->HasParameter("name"));
+}
+
+TEST(PlinthOptionParser, BooleansAcceptThreeSpellingsInAnyCase) {
+    for (std::string word : {"true", "TRUE", "Yes", "1"}) EXPECT_TRUE(Parse({"-e", word})->GetBool("enabled")) << word;
+    for (std::string word : {"false", "No", "NO", "0"}) {
+        boost::shared_ptr<Input> input = Parse({"-e", word});
+        EXPECT_TRUE(input->HasParameter("enabled")) << word;
+        EXPECT_FALSE(input->GetBool("enabled")) << word;
+    }
+    EXPECT_EQ("Invalid value for option --enabled: 'on' is not a boolean (use true/false, yes/no or 1/0).",
+              Refusal({"--enabled", "on"}));
+    EXPECT_NE("", Refusal({"-e", "2"}));
+}
+
+TEST(PlinthOptionParser, IntegersAreDecimal64BitAndNothingElse) {
+    EXPECT_EQ(9223372036854775807LL, Parse({"-c", "9223372036854775807"})->GetLongLong("count"));
+    EXPECT_EQ(-9223372036854775807LL - 1, Parse({"-c", "-9223372036854775808"})->GetLongLong("count"));
+    EXPECT_EQ("Invalid value for option --count: '9223372036854775808' is outside the 64-bit integer range.",
+              Refusal({"-c", "9223372036854775808"}));
+    EXPECT_NE("", Refusal({"-c", "-9223372036854775809"}));
+    EXPECT_EQ("Invalid value for option --count: 'abc' is not an integer.", Refusal({"--count", "abc"}));
+    for (std::string word : {"0x10", "1.5", "12a", " 3", "+", "1e3"}) {
+        EXPECT_NE("", Refusal({"--count=" + word})) << word;
+    }
+}
+
+TEST(PlinthOptionParser, IntRangeIsInclusive) {
+    EXPECT_EQ(1, Parse({"--ports", "1"})->GetInt("ports"));
+    EXPECT_EQ(4096, Parse({"--ports", "4096"})->GetInt("ports"));
+    EXPECT_EQ("Invalid value for option --ports: 4097 is not in the range 1 to 4096.", Refusal({"--ports", "4097"}));
+    EXPECT_EQ("Invalid value for option --ports: 0 is not in the range 1 to 4096.", Refusal({"--ports", "0"}));
+    EXPECT_NE("", Refusal({"--ports", "-1"}));
+}
+
+TEST(PlinthOptionParser, EnumsAcceptExactlyTheListedValues) {
+    EXPECT_EQ(100, Parse({"--speed", "100"})->GetInt("speed"));
+    EXPECT_EQ("Invalid value for option --speed: 1000 is not one of 10, 100.", Refusal({"--speed", "1000"}));
+    EXPECT_EQ("static", Parse({"--type", "static"})->GetString("type"));
+    EXPECT_EQ("Invalid value for option --type: 'Static' is not one of static, dhcp.", Refusal({"--type", "Static"}));
+    EXPECT_NE("", Refusal({"--type", "stat"}));
+    EXPECT_NE("", Refusal({"--type", ""}));
+}
+
+TEST(PlinthOptionParser, RegexMustMatchTheWholeValue) {
+    EXPECT_EQ("tsl0", Parse({"--interface", "tsl0"})->GetString("interface"));
+    EXPECT_EQ("Invalid value for option --interface: 'tsl' does not match the pattern tsl[0-9]+.",
+              Refusal({"--interface", "tsl"}));
+    EXPECT_NE("", Refusal({"--interface", "xtsl0"}));
+    EXPECT_NE("", Refusal({"--interface", "tsl0x"}));
+}
+
+TEST(PlinthOptionParser, RefusesMalformedCommandLines) {
+    EXPECT_EQ("Unknown option --nme.", Refusal({"--nme", "x"}));
+    EXPECT_EQ("Unknown option -x.", Refusal({"-x", "1"}));
+    EXPECT_EQ("Option --name was given more than once.", Refusal({"--name", "a", "-n", "b"}));
+    EXPECT_EQ("Option --verbose was given more than once.", Refusal({"-v", "--verbose"}));
+    EXPECT_EQ("Option --verbose is a flag and takes no value.", Refusal({"--verbose=true"}));
+    EXPECT_EQ("Option --name requires a value.", Refusal({"--name"}));
+    EXPECT_EQ("Option --name requires a value.", Refusal({"--name", "--count", "1"}));
+    EXPECT_EQ("Unexpected argument 'extra'.", Refusal({"-v", "extra"}));
+    // A flag does not swallow the next word.
+    EXPECT_EQ("Unexpected argument 'true'.", Refusal({"-v", "true"}));
+}
+
+TEST(PlinthOptionParser, RequiredOptionsMustBeGiven) {
+    boost::shared_ptr<InputSpec> spec = InputSpec::New();
+    spec->AddParameter(MakeParameter("ruleset-id", PARAMETER_STRING, "r", "", true));
+    spec->AddParameter(MakeParameter("enabled", PARAMETER_BOOL, "e", "", true));
+    try {
+        ParseCommandOptions(*spec, {"-e", "true"});
+        FAIL() << "accepted without --ruleset-id";
+    } catch (UsageError const& refusal) {
+        EXPECT_STREQ("Missing required option --ruleset-id.", refusal.what());
+    }
+    EXPECT_NO_THROW(ParseCommandOptions(*spec, {"-r", "dns", "-e", "0"}));
+    // A command without parameters takes an empty command line only.
+    EXPECT_NO_THROW(ParseCommandOptions(*InputSpec::New(), {}));
+    EXPECT_THROW(ParseCommandOptions(*InputSpec::New(), {"--any"}), UsageError);
+}
