@@ -1,0 +1,76 @@
+#pragma once
+
+// Runs one command as the tool would: its options parsed and validated
+// against its own InputSpec, then Execute, and gives back what the Output
+// received.
+//
+//   TempHost host;
+//   CommandRun run = RunCommand<FirewallRulesetSet>({"--ruleset-id", "dns", "--enabled", "false"});
+//   EXPECT_EQ(run.errors, std::vector<std::string>{});
+//   EXPECT_EQ(run.Json(), "true");
+//
+// A command line the tool would refuse throws Plinth::Cli::UsageError.
+
+#include <map>
+#include <sstream>
+#include <string>
+#include <vector>
+
+#include <boost/shared_ptr.hpp>
+#include <nlohmann/json.hpp>
+
+#include "plinth/callspec/Input.h"
+#include "plinth/callspec/Output.h"
+#include "plinth/callspec/OutputSpec.h"
+#include "plinth/cli/FormatHints.h"
+#include "plinth/cli/Formatters.h"
+#include "plinth/cli/OptionParser.h"
+#include "plinth/metaobj/MetaObject.h"
+
+struct CommandRun {
+    std::vector<std::string> errors;
+    boost::shared_ptr<Plinth::MetaObj::MetaObject> result;  // null when none was set
+    bool finished = false;
+    boost::shared_ptr<Plinth::MetaObj::MetaObject> shape;
+    std::map<std::string, std::string> hints;
+
+    bool HasResult() const { return result != nullptr; }
+
+    // The result as the json formatter prints it, without the line break;
+    // "" when there is no result.
+    std::string Json() const {
+        if (!result) return "";
+        std::ostringstream out;
+        Plinth::Cli::JsonFormatter().Write(out, result, shape, Plinth::Cli::FormatHints(hints));
+        std::string text = out.str();
+        while (!text.empty() && text.back() == '\n') text.pop_back();
+        return text;
+    }
+
+    // The result parsed back, for assertions on single fields.
+    nlohmann::ordered_json Parsed() const { return nlohmann::ordered_json::parse(Json()); }
+
+    // The result as the command's default formatter (or the one named) shows it.
+    std::string Text(const Plinth::Cli::Formatter& formatter) const {
+        std::ostringstream out;
+        if (result) formatter.Write(out, result, shape, Plinth::Cli::FormatHints(hints));
+        return out.str();
+    }
+};
+
+template <class CommandClass>
+CommandRun RunCommand(const std::vector<std::string>& words = {}) {
+    boost::shared_ptr<CommandClass> command = CommandClass::New();
+    boost::shared_ptr<Plinth::CallSpec::Input> input =
+        Plinth::Cli::ParseCommandOptions(*command->GetInputSpec(), words);
+    boost::shared_ptr<Plinth::CallSpec::Output> output = Plinth::CallSpec::Output::New();
+    command->Execute(input, output);
+
+    CommandRun run;
+    run.errors = output->GetErrors();
+    run.result = output->GetResult();
+    run.finished = output->IsFinished();
+    run.shape = command->GetOutputSpec()->GetResultType();
+    run.hints = command->GetDefaultOutputFormatParameters();
+    return run;
+}
