@@ -1,6 +1,27 @@
 #include <vector>
 
+#include "FirewallGet.h"
+#include "FirewallLoad.h"
+#include "FirewallRefresh.h"
+#include "FirewallRulesetAllowedipAdd.h"
+#include "FirewallRulesetAllowedipList.h"
+#include "FirewallRulesetAllowedipRemove.h"
+#include "FirewallRulesetList.h"
+#include "FirewallRulesetRuleList.h"
+#include "FirewallRulesetSet.h"
+#include "FirewallSet.h"
+#include "FirewallUnload.h"
 #include "NamespaceTreeBuilder.h"
+#include "VirtualSwitchPortGroupAdd.h"
+#include "VirtualSwitchPortGroupList.h"
+#include "VirtualSwitchPortGroupRemove.h"
+#include "VirtualSwitchPortGroupSet.h"
+#include "VirtualSwitchStandardAdd.h"
+#include "VirtualSwitchStandardList.h"
+#include "VirtualSwitchStandardRemove.h"
+#include "VirtualSwitchStandardSet.h"
+#include "VirtualSwitchStandardUplinkAdd.h"
+#include "VirtualSwitchStandardUplinkRemove.h"
 #include "plinth/autocli/PluginEntry.h"
 
 namespace KorvexCli {
@@ -92,8 +113,14 @@ std::vector<TreeRow> NetworkTree() {
                      "Commands to list and manipulate Virtual Switches on an Halden host."),
         NamespaceRow("network vswitch standard",
                      "Commands to list and manipulate Legacy Virtual Switches on an Halden host."),
+        CommandRow<VirtualSwitchStandardAdd>("network vswitch standard add"),
+        CommandRow<VirtualSwitchStandardSet>("network vswitch standard set"),
+        CommandRow<VirtualSwitchStandardList>("network vswitch standard list"),
+        CommandRow<VirtualSwitchStandardRemove>("network vswitch standard remove"),
         NamespaceRow("network vswitch standard uplink",
                      "Commands to add and remove uplink on given virtual switch."),
+        CommandRow<VirtualSwitchStandardUplinkAdd>("network vswitch standard uplink add"),
+        CommandRow<VirtualSwitchStandardUplinkRemove>("network vswitch standard uplink remove"),
         NamespaceRow("network vswitch standard policy",
                      "Commands to manipulate network policy settings governing the given virtual switch."),
         NamespaceRow("network vswitch standard policy shaping",
@@ -104,6 +131,10 @@ std::vector<TreeRow> NetworkTree() {
                      "Commands to manipulate failover policy setting for the given virtual switch."),
         NamespaceRow("network vswitch standard portgroup",
                      "Commands to list and manipulate Port Groups on an Halden host."),
+        CommandRow<VirtualSwitchPortGroupList>("network vswitch standard portgroup list"),
+        CommandRow<VirtualSwitchPortGroupAdd>("network vswitch standard portgroup add"),
+        CommandRow<VirtualSwitchPortGroupRemove>("network vswitch standard portgroup remove"),
+        CommandRow<VirtualSwitchPortGroupSet>("network vswitch standard portgroup set"),
         NamespaceRow("network vswitch standard portgroup policy",
                      "Commands to manipulate network policy settings governing the given portgroup."),
         NamespaceRow("network vswitch standard portgroup policy shaping",
@@ -128,12 +159,23 @@ std::vector<TreeRow> NetworkTree() {
                      "Command to set LACP LAG timeout"),
         NamespaceRow("network firewall",
                      "A set of commands for firewall related operations"),
+        CommandRow<FirewallGet>("network firewall get"),
+        CommandRow<FirewallSet>("network firewall set"),
+        CommandRow<FirewallLoad>("network firewall load"),
+        CommandRow<FirewallRefresh>("network firewall refresh"),
+        CommandRow<FirewallUnload>("network firewall unload"),
         NamespaceRow("network firewall ruleset",
                      "Commands to list and update firewall ruleset configuration"),
+        CommandRow<FirewallRulesetList>("network firewall ruleset list"),
+        CommandRow<FirewallRulesetSet>("network firewall ruleset set"),
         NamespaceRow("network firewall ruleset rule",
                      "Commands to list rules in the ruleset"),
+        CommandRow<FirewallRulesetRuleList>("network firewall ruleset rule list"),
         NamespaceRow("network firewall ruleset allowedip",
                      "Commands to list and add/remove allowedip on ruleset"),
+        CommandRow<FirewallRulesetAllowedipList>("network firewall ruleset allowedip list"),
+        CommandRow<FirewallRulesetAllowedipAdd>("network firewall ruleset allowedip add"),
+        CommandRow<FirewallRulesetAllowedipRemove>("network firewall ruleset allowedip remove"),
         NamespaceRow("network port",
                      "Commands to get information about a port"),
         NamespaceRow("network port stats",

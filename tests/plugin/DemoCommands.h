@@ -31,7 +31,7 @@ DEMO_COMMAND(Throw);
 // demo bool: a boolean result, set or unset.
 DEMO_COMMAND(Bool);
 // demo nic list: a table of structures with fields, header and unit hints.
-DEMO_COMMAND(NicList);
+DEMO_COMMAND(NicTable);
 // demo switch get: nested structures and lists in a simple layout.
 DEMO_COMMAND(SwitchGet);
 

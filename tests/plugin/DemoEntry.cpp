@@ -13,7 +13,7 @@ extern "C" void AutoCli_RegisterNamespaces(boost::shared_ptr<NamespaceNode> root
 
     boost::shared_ptr<Namespace> nic = Namespace::New();
     nic->SetDescription("Result shapes of a table.");
-    nic->RegisterNamespaceNode(Demo::NicList::New(), "list");
+    nic->RegisterNamespaceNode(Demo::NicTable::New(), "list");
     demo->RegisterNamespaceNode(nic, "nic");
 
     boost::shared_ptr<Namespace> vswitch = Namespace::New();

@@ -113,7 +113,7 @@ void Bool::ExecuteInternal(boost::shared_ptr<Input> input, boost::shared_ptr<Out
     output->Finish();
 }
 
-NicList::NicList() {
+NicTable::NicTable() {
     SetDescription("List the demo NICs.");
     SetMetaDataField("type", "fetcher");
     SetDefaultOutputFormatter("simple");
@@ -123,17 +123,17 @@ NicList::NicList() {
     SetDefaultOutputParameter("units:Nic.Speed", "Mbps");
 }
 
-boost::shared_ptr<InputSpec> NicList::GetInputSpecInternal() {
+boost::shared_ptr<InputSpec> NicTable::GetInputSpecInternal() {
     boost::shared_ptr<InputSpec> spec = InputSpec::New();
     spec->AddParameter(Flag("empty", "List no NIC at all."));
     return spec;
 }
 
-boost::shared_ptr<OutputSpec> NicList::GetOutputSpecInternal() {
+boost::shared_ptr<OutputSpec> NicTable::GetOutputSpecInternal() {
     return ResultType(MetaList::New(META_STRUCT, NicStructure()));
 }
 
-void NicList::ExecuteInternal(boost::shared_ptr<Input> input, boost::shared_ptr<Output> output) {
+void NicTable::ExecuteInternal(boost::shared_ptr<Input> input, boost::shared_ptr<Output> output) {
     boost::shared_ptr<MetaList> nics = MetaList::New(3, NicStructure());
     if (!input->GetFlag("empty")) {
         nics->AddMetaStruct(Nic("pnet0", true, 10000, "Uplink of switch0"));

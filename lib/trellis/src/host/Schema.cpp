@@ -16,6 +16,13 @@ const std::vector<Migration>& Migrations() {
              SeedSection(t, "modules");
              SeedSection(t, "firewall");
          }},
+        {3, "physical NICs, standard switches, port groups and the ports in use",
+         [](Transaction& t) {
+             SeedSection(t, "nics");
+             SeedSection(t, "standardSwitches");
+             SeedSection(t, "portGroups");
+             SeedSection(t, "ports");
+         }},
     };
     return steps;
 }

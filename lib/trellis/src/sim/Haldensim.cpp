@@ -162,8 +162,13 @@ Host::Fault FaultToAdd(const ParsedOptions& options) {
 
 int FaultList(const ParsedOptions& options, Io& io) {
     std::vector<Host::Fault> faults = Host::ListFaults();
+    // The fault column lines up under the names printed: all, or the armed ones.
     std::size_t width = 0;
-    for (const std::string& name : Host::Operation::KnownNames()) width = std::max(width, name.size());
+    if (options.Has("armed")) {
+        for (const Host::Fault& fault : faults) width = std::max(width, fault.operation.size());
+    } else {
+        for (const std::string& name : Host::Operation::KnownNames()) width = std::max(width, name.size());
+    }
     for (const std::string& name : Host::Operation::KnownNames()) {
         auto fault = std::find_if(faults.begin(), faults.end(), [&](const Host::Fault& f) { return f.operation == name; });
         if (fault == faults.end()) {

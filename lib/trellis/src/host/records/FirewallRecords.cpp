@@ -1,22 +1,26 @@
 #include "trellis/host/records/FirewallRecords.h"
 
 #include <algorithm>
+#include <optional>
 
 #include <nlohmann/json.hpp>
 
-#include "host/records/IpText.h"
+#include "host/records/AllowedIpText.h"
 
 namespace Trellis {
 namespace Host {
 
 namespace {
 
-std::vector<std::string> ReadAddressList(const JsonReader& in, const char* key, bool (*isCanonical)(const std::string&),
+// An entry is taken only in its canonical form, so that the stored text is
+// the one that AddAllowedIp would store and RemoveAllowedIp finds.
+std::vector<std::string> ReadAddressList(const JsonReader& in, const char* key, AllowedIpKind kind,
                                          const char* expected) {
     std::vector<std::string> list;
     for (const JsonReader& element : in.Array(key)) {
         std::string text = element.AsString();
-        if (!isCanonical(text)) element.Fail(std::string("expected ") + expected);
+        std::optional<AllowedIp> entry = ParseAllowedIp(text);
+        if (!entry || entry->kind != kind || entry->text != text) element.Fail(std::string("expected ") + expected);
         if (std::find(list.begin(), list.end(), text) != list.end()) element.Fail("duplicate entry \"" + text + "\"");
         list.push_back(text);
     }
@@ -64,13 +68,13 @@ Json FirewallAllowedIps::ToJson() const {
 FirewallAllowedIps FirewallAllowedIps::FromJson(const JsonReader& in) {
     FirewallAllowedIps ips;
     if (!in.IsPresent()) return ips;
-    ips.ipv4Addresses = ReadAddressList(in, "ipv4Addresses", IsCanonicalIpv4Address,
+    ips.ipv4Addresses = ReadAddressList(in, "ipv4Addresses", AllowedIpKind::Ipv4Address,
                                         "an IPv4 address in canonical form, such as \"192.0.2.1\"");
-    ips.ipv4Networks = ReadAddressList(in, "ipv4Networks", IsCanonicalIpv4Network,
+    ips.ipv4Networks = ReadAddressList(in, "ipv4Networks", AllowedIpKind::Ipv4Network,
                                        "an IPv4 network in canonical form, such as \"192.0.2.0/24\"");
-    ips.ipv6Addresses = ReadAddressList(in, "ipv6Addresses", IsCanonicalIpv6Address,
+    ips.ipv6Addresses = ReadAddressList(in, "ipv6Addresses", AllowedIpKind::Ipv6Address,
                                         "an IPv6 address in canonical form, such as \"2001:db8::1\"");
-    ips.ipv6Networks = ReadAddressList(in, "ipv6Networks", IsCanonicalIpv6Network,
+    ips.ipv6Networks = ReadAddressList(in, "ipv6Networks", AllowedIpKind::Ipv6Network,
                                        "an IPv6 network in canonical form, such as \"2001:db8::/32\"");
     in.RejectUnknownMembers();
     return ips;

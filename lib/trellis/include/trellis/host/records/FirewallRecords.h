@@ -42,7 +42,8 @@ struct FirewallPortRule {
 
 // The addresses a ruleset admits when it does not admit all. Each entry is
 // kept in canonical text ("192.0.2.1", "198.51.100.0/24", "2001:db8::1",
-// "2001:db8::/32") and stands at most once in its list.
+// "2001:db8::/32"; a network without host bits) and stands at most once in
+// its list.
 struct FirewallAllowedIps {
     std::vector<std::string> ipv4Addresses;
     std::vector<std::string> ipv4Networks;

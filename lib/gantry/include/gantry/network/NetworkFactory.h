@@ -1,0 +1,23 @@
+#pragma once
+
+#include <string>
+
+namespace Gantry {
+namespace Network {
+
+class PortGroup;
+class VirtualSwitch;
+
+// Lookups of host objects across the host. What they return belongs to the
+// caller. The implementation library provides the operations.
+class NetworkFactory {
+public:
+    // The port group of that name on any standard switch, or null.
+    static PortGroup* GetPortGroupByName(std::string const& name);
+    // The standard switch of that name; throws GantryException when there is
+    // none.
+    static VirtualSwitch* GetVirtualSwitchById(std::string const& name);
+};
+
+}  // namespace Network
+}  // namespace Gantry

@@ -1,0 +1,61 @@
+// "ports": the ports in use by clients (kernel interfaces, VM adapters).
+// Each port's switch and port group exist and belong together, and no switch
+// has more ports in use (clients and uplinks) than it has ports.
+
+#include <map>
+#include <set>
+
+#include <nlohmann/json.hpp>
+
+#include "host/description/SwitchingSections.h"
+#include "trellis/host/Transaction.h"
+
+namespace Trellis {
+namespace Host {
+
+void PortsSection::Parse(const JsonReader& value) {
+    std::set<std::int64_t> ids;
+    for (const JsonReader& element : value.Elements()) {
+        PortRecord port = PortRecord::FromJson(element);
+        if (!ids.insert(port.id).second) element.Member("id").Fail("duplicate port " + port.name);
+        ports_.push_back(port);
+        paths_.push_back(element.Path());
+    }
+}
+
+void PortsSection::CheckReferences(const ParsedDescription& description) const {
+    const auto& switches = description.Get<StandardSwitchesSection>();
+    const auto& groups = description.Get<PortGroupsSection>();
+    std::map<std::string, int> used;
+    for (std::size_t i = 0; i < ports_.size(); ++i) {
+        const PortRecord& port = ports_[i];
+        const StandardSwitchRecord* vswitch = switches.Find(port.portset);
+        if (vswitch == nullptr)
+            throw DescriptionError(paths_[i] + ".portset: no standard switch \"" + port.portset + "\"");
+        const PortGroupRecord* group = groups.Find(port.portGroup);
+        if (group == nullptr || group->vswitch != port.portset)
+            throw DescriptionError(paths_[i] + ".portGroup: no port group \"" + port.portGroup + "\" on \"" +
+                                   port.portset + "\"");
+        auto count = used.emplace(port.portset, static_cast<int>(vswitch->uplinks.size())).first;
+        if (++count->second > vswitch->numPorts)
+            throw DescriptionError(paths_[i] + ": \"" + port.portset + "\" has no free port left (" +
+                                   std::to_string(vswitch->numPorts) + " ports)");
+    }
+}
+
+void PortsSection::Write(Transaction& t) const {
+    for (const PortRecord& port : ports_) t.Put(port);
+}
+
+Json PortsSection::Export(const Transaction& t) const {
+    Json ports = Json::array();
+    for (const PortRecord& port : t.List<PortRecord>()) ports.push_back(port.ToJson());
+    return ports;
+}
+
+namespace {
+const SectionRegistration kPorts("ports", 80, [] { return std::make_unique<PortsSection>(); });
+}  // namespace
+
+}  // namespace Host
+}  // namespace Trellis

@@ -1,0 +1,61 @@
+// "standardSwitches": the host's standard switches, as a list of switch
+// records. An uplink stands on one switch at most; the configured ports of
+// all switches stay within the host's limit. An uplink need not name a NIC
+// of the "nics" section: a NIC that went away stays listed by its switch
+// (the tools hide it).
+
+#include <map>
+#include <set>
+
+#include <nlohmann/json.hpp>
+
+#include "host/description/SwitchingSections.h"
+#include "trellis/host/Transaction.h"
+
+namespace Trellis {
+namespace Host {
+
+void StandardSwitchesSection::Parse(const JsonReader& value) {
+    std::set<std::string> names;
+    std::map<std::string, std::string> switchOfUplink;
+    int totalPorts = 0;
+    for (const JsonReader& element : value.Elements()) {
+        StandardSwitchRecord vswitch = StandardSwitchRecord::FromJson(element);
+        if (!names.insert(vswitch.name).second)
+            element.Member("name").Fail("duplicate switch \"" + vswitch.name + "\"");
+        for (const std::string& uplink : vswitch.uplinks) {
+            auto taken = switchOfUplink.emplace(uplink, vswitch.name);
+            if (!taken.second)
+                element.Member("uplinks").Fail("\"" + uplink + "\" is already an uplink of \"" + taken.first->second + "\"");
+        }
+        totalPorts += vswitch.numPorts;
+        if (totalPorts > SwitchLimits::kMaxPortsPerHost)
+            element.Member("numPorts").Fail("the switches have more than " +
+                                            std::to_string(SwitchLimits::kMaxPortsPerHost) + " ports in all");
+        switches_.push_back(vswitch);
+    }
+}
+
+void StandardSwitchesSection::Write(Transaction& t) const {
+    for (const StandardSwitchRecord& vswitch : switches_) t.Put(vswitch);
+}
+
+Json StandardSwitchesSection::Export(const Transaction& t) const {
+    Json switches = Json::array();
+    for (const StandardSwitchRecord& vswitch : t.List<StandardSwitchRecord>()) switches.push_back(vswitch.ToJson());
+    return switches;
+}
+
+const StandardSwitchRecord* StandardSwitchesSection::Find(const std::string& name) const {
+    for (const StandardSwitchRecord& vswitch : switches_)
+        if (vswitch.name == name) return &vswitch;
+    return nullptr;
+}
+
+namespace {
+const SectionRegistration kStandardSwitches("standardSwitches", 40,
+                                            [] { return std::make_unique<StandardSwitchesSection>(); });
+}  // namespace
+
+}  // namespace Host
+}  // namespace Trellis

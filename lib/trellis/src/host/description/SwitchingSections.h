@@ -1,0 +1,57 @@
+#pragma once
+
+// The sections of the host's standard switching, declared here because each
+// checks its references into the one before it:
+//   "standardSwitches" -> "portGroups" (a group's switch) -> "ports" (a
+//   port's switch and group).
+
+#include <vector>
+
+#include "host/description/Section.h"
+#include "trellis/host/records/PortRecord.h"
+#include "trellis/host/records/SwitchRecords.h"
+
+namespace Trellis {
+namespace Host {
+
+class StandardSwitchesSection : public Section {
+public:
+    void Parse(const JsonReader& value) override;
+    void Write(Transaction& t) const override;
+    Json Export(const Transaction& t) const override;
+
+    const std::vector<StandardSwitchRecord>& Switches() const { return switches_; }
+    const StandardSwitchRecord* Find(const std::string& name) const;
+
+private:
+    std::vector<StandardSwitchRecord> switches_;
+};
+
+class PortGroupsSection : public Section {
+public:
+    void Parse(const JsonReader& value) override;
+    void CheckReferences(const ParsedDescription& description) const override;
+    void Write(Transaction& t) const override;
+    Json Export(const Transaction& t) const override;
+
+    const PortGroupRecord* Find(const std::string& name) const;
+
+private:
+    std::vector<PortGroupRecord> groups_;
+    std::vector<std::string> paths_;  // where each group stands, for messages
+};
+
+class PortsSection : public Section {
+public:
+    void Parse(const JsonReader& value) override;
+    void CheckReferences(const ParsedDescription& description) const override;
+    void Write(Transaction& t) const override;
+    Json Export(const Transaction& t) const override;
+
+private:
+    std::vector<PortRecord> ports_;
+    std::vector<std::string> paths_;
+};
+
+}  // namespace Host
+}  // namespace Trellis

@@ -1,0 +1,54 @@
+#include "trellis/network/NetworkInfoImpl.h"
+
+#include <optional>
+#include <utility>
+
+#include "trellis/host/Operation.h"
+#include "trellis/host/records/PnicRecord.h"
+#include "trellis/host/records/SwitchRecords.h"
+#include "trellis/network/PnicImpl.h"
+#include "trellis/network/PortGroupImpl.h"
+
+namespace Trellis {
+namespace Network {
+
+namespace {
+
+using Trellis::Host::Operation;
+using Trellis::Host::PnicRecord;
+using Trellis::Host::PortGroupRecord;
+using Trellis::Host::Transaction;
+
+const Operation kConstruct("NetworkInfoImpl::NetworkInfoImpl");
+const Operation kGetPnics("NetworkInfoImpl::GetPnics");
+const Operation kGetPnicByName("NetworkInfoImpl::GetPnicByName");
+const Operation kGetAllPortGroups("NetworkInfoImpl::GetAllPortGroups");
+
+}  // namespace
+
+NetworkInfoImpl::NetworkInfoImpl() { kConstruct.Check(); }
+
+NetworkInfoImpl::~NetworkInfoImpl() {}
+
+std::vector<Gantry::Network::Pnic*> NetworkInfoImpl::GetPnics() {
+    std::vector<PnicRecord> records = kGetPnics.Read([](Transaction& t) { return t.List<PnicRecord>(); });
+    std::vector<Gantry::Network::Pnic*> nics;
+    for (PnicRecord& record : records) nics.push_back(new PnicImpl(std::move(record)));
+    return nics;
+}
+
+Gantry::Network::Pnic* NetworkInfoImpl::GetPnicByName(std::string const& name) {
+    std::optional<PnicRecord> record = kGetPnicByName.Read([&](Transaction& t) { return t.Find<PnicRecord>(name); });
+    return record ? new PnicImpl(std::move(*record)) : nullptr;
+}
+
+std::vector<Gantry::Network::PortGroup*> NetworkInfoImpl::GetAllPortGroups() {
+    std::vector<PortGroupRecord> records =
+        kGetAllPortGroups.Read([](Transaction& t) { return t.List<PortGroupRecord>(); });
+    std::vector<Gantry::Network::PortGroup*> groups;
+    for (PortGroupRecord& record : records) groups.push_back(new PortGroupImpl(std::move(record)));
+    return groups;
+}
+
+}  // namespace Network
+}  // namespace Trellis

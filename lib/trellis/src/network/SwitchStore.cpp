@@ -1,0 +1,85 @@
+#include "SwitchStore.h"
+
+#include <algorithm>
+
+#include "PolicyInheritance.h"
+#include "gantry/lib/GantryException.h"
+
+namespace Trellis {
+namespace Network {
+namespace SwitchStore {
+
+using Trellis::Host::PortGroupRecord;
+using Trellis::Host::PortRecord;
+using Trellis::Host::StandardSwitchRecord;
+using Trellis::Host::Transaction;
+
+void Refuse(std::string const& message) { throw Gantry::Lib::GantryException(message); }
+
+StandardSwitchRecord RequireSwitch(Transaction const& t, std::string const& name) {
+    std::optional<StandardSwitchRecord> vswitch = t.Find<StandardSwitchRecord>(name);
+    if (!vswitch) Refuse("Virtual switch " + name + " does not exist");
+    return *vswitch;
+}
+
+PortGroupRecord RequirePortGroup(Transaction const& t, std::string const& name) {
+    std::optional<PortGroupRecord> group = t.Find<PortGroupRecord>(name);
+    if (!group) Refuse("Port group " + name + " does not exist");
+    return *group;
+}
+
+std::vector<PortGroupRecord> PortGroupsOf(Transaction const& t, std::string const& vswitch) {
+    std::vector<PortGroupRecord> groups = t.List<PortGroupRecord>();
+    groups.erase(std::remove_if(groups.begin(), groups.end(),
+                                [&](PortGroupRecord const& group) { return group.vswitch != vswitch; }),
+                 groups.end());
+    return groups;
+}
+
+std::int64_t ClientPortsOf(Transaction const& t, std::string const& vswitch) {
+    std::vector<PortRecord> ports = t.List<PortRecord>();
+    return std::count_if(ports.begin(), ports.end(), [&](PortRecord const& port) { return port.portset == vswitch; });
+}
+
+std::int64_t ActiveClientsOf(Transaction const& t, PortGroupRecord const& group) {
+    std::vector<PortRecord> ports = t.List<PortRecord>();
+    return std::count_if(ports.begin(), ports.end(), [&](PortRecord const& port) {
+        return port.portset == group.vswitch && port.portGroup == group.name;
+    });
+}
+
+int UsedPortsOf(Transaction const& t, StandardSwitchRecord const& vswitch) {
+    return static_cast<int>(ClientPortsOf(t, vswitch.name) + static_cast<std::int64_t>(vswitch.uplinks.size()));
+}
+
+int ConfiguredPortsOnHost(Transaction const& t) {
+    int total = 0;
+    for (StandardSwitchRecord const& vswitch : t.List<StandardSwitchRecord>()) total += vswitch.numPorts;
+    return total;
+}
+
+std::optional<std::string> SwitchOfUplink(Transaction const& t, std::string const& nic) {
+    for (StandardSwitchRecord const& vswitch : t.List<StandardSwitchRecord>())
+        if (std::find(vswitch.uplinks.begin(), vswitch.uplinks.end(), nic) != vswitch.uplinks.end())
+            return vswitch.name;
+    return std::nullopt;
+}
+
+Trellis::Host::StoredPolicies PortGroupPolicies(Transaction const& t, PortGroupRecord const& group) {
+    return PortGroupPoliciesInForce(SwitchPoliciesInForce(RequireSwitch(t, group.vswitch)), group);
+}
+
+Gantry::Network::NicTeamingPolicy StorableTeamingPolicy(Gantry::Network::NicTeamingPolicy policy,
+                                                        std::string const& owner) {
+    using Gantry::Network::NicTeamingPolicy;
+    auto value = static_cast<std::uint32_t>(policy.teamPolicy);
+    if ((policy.setMask & NicTeamingPolicy::MASK_TEAM_POLICY) != 0 && (value < 1 || value > 4))
+        Refuse("Invalid load balancing policy " + std::to_string(value) + " for " + owner);
+    policy.setMask &= ~NicTeamingPolicy::MASK_RESERVED0;
+    policy.reserved0 = false;
+    return policy;
+}
+
+}  // namespace SwitchStore
+}  // namespace Network
+}  // namespace Trellis

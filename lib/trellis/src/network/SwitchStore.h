@@ -1,0 +1,50 @@
+#pragma once
+
+// Reading and checking the switching records inside one host operation's
+// transaction. Every refusal is a GantryException whose text names the
+// object.
+
+#include <cstdint>
+#include <optional>
+#include <string>
+#include <vector>
+
+#include "trellis/host/Transaction.h"
+#include "trellis/host/records/PortRecord.h"
+#include "trellis/host/records/SwitchRecords.h"
+
+namespace Trellis {
+namespace Network {
+namespace SwitchStore {
+
+[[noreturn]] void Refuse(std::string const& message);
+
+Trellis::Host::StandardSwitchRecord RequireSwitch(Trellis::Host::Transaction const& t, std::string const& name);
+Trellis::Host::PortGroupRecord RequirePortGroup(Trellis::Host::Transaction const& t, std::string const& name);
+
+// The port groups of a switch, in the host's order.
+std::vector<Trellis::Host::PortGroupRecord> PortGroupsOf(Trellis::Host::Transaction const& t,
+                                                         std::string const& vswitch);
+// The client ports on a switch, or in one port group.
+std::int64_t ClientPortsOf(Trellis::Host::Transaction const& t, std::string const& vswitch);
+std::int64_t ActiveClientsOf(Trellis::Host::Transaction const& t, Trellis::Host::PortGroupRecord const& group);
+// Client ports and uplinks.
+int UsedPortsOf(Trellis::Host::Transaction const& t, Trellis::Host::StandardSwitchRecord const& vswitch);
+// The configured ports of all switches of the host.
+int ConfiguredPortsOnHost(Trellis::Host::Transaction const& t);
+// The switch that has the NIC as an uplink, if any.
+std::optional<std::string> SwitchOfUplink(Trellis::Host::Transaction const& t, std::string const& nic);
+
+// The policies in force on a port group, read with its switch's.
+Trellis::Host::StoredPolicies PortGroupPolicies(Trellis::Host::Transaction const& t,
+                                                Trellis::Host::PortGroupRecord const& group);
+
+// The teaming policy as the host stores it for owner ("virtual switch
+// switch0"): refuses a load balancing policy outside 1..4, and drops the
+// unnamed flag, which the host does not keep.
+Gantry::Network::NicTeamingPolicy StorableTeamingPolicy(Gantry::Network::NicTeamingPolicy policy,
+                                                        std::string const& owner);
+
+}  // namespace SwitchStore
+}  // namespace Network
+}  // namespace Trellis

@@ -1,0 +1,95 @@
+#include "trellis/network/VirtualSwitchInfoImpl.h"
+
+#include <optional>
+#include <utility>
+
+#include "SwitchStore.h"
+#include "trellis/host/Operation.h"
+#include "trellis/network/VirtualSwitchImpl.h"
+
+namespace Trellis {
+namespace Network {
+
+namespace {
+
+using Trellis::Host::Operation;
+using Trellis::Host::PortGroupRecord;
+using Trellis::Host::StandardSwitchRecord;
+using Trellis::Host::SwitchLimits;
+using Trellis::Host::Transaction;
+
+const Operation kConstruct("VirtualSwitchInfoImpl::VirtualSwitchInfoImpl");
+const Operation kAddVirtualSwitchWithPolicy("VirtualSwitchInfoImpl::AddVirtualSwitchWithPolicy");
+const Operation kGetVirtualSwitches("VirtualSwitchInfoImpl::GetVirtualSwitches");
+const Operation kGetVirtualSwitchByName("VirtualSwitchInfoImpl::GetVirtualSwitchByName");
+const Operation kRemoveVirtualSwitch("VirtualSwitchInfoImpl::RemoveVirtualSwitch");
+
+}  // namespace
+
+VirtualSwitchInfoImpl::VirtualSwitchInfoImpl() { kConstruct.Check(); }
+
+VirtualSwitchInfoImpl::~VirtualSwitchInfoImpl() {}
+
+// The simulated host has no offloads to configure on a switch: the
+// capabilities are taken and not kept.
+Gantry::Network::VirtualSwitch* VirtualSwitchInfoImpl::AddVirtualSwitchWithPolicy(
+    Gantry::Network::NicTeamingPolicy const& teaming, Gantry::Network::PortSecurityPolicy const& security,
+    Gantry::Network::ShapingPolicy const& shaping, Gantry::Network::NicCapabilities const& /*capabilities*/,
+    std::string const& name, int numPorts) {
+    StandardSwitchRecord created = kAddVirtualSwitchWithPolicy.Write([&](Transaction& t) {
+        const std::string refusal = "Unable to create virtual switch " + name + ": ";
+        if (name.empty()) SwitchStore::Refuse("Unable to create a virtual switch: its name must not be empty");
+        if (t.Contains<StandardSwitchRecord>(name))
+            SwitchStore::Refuse(refusal + "a virtual switch of that name already exists");
+        if (numPorts < SwitchLimits::kMinPorts || numPorts > SwitchLimits::kMaxPortsPerSwitch)
+            SwitchStore::Refuse(refusal + std::to_string(numPorts) + " is not a valid number of ports (" +
+                                std::to_string(SwitchLimits::kMinPorts) + " to " +
+                                std::to_string(SwitchLimits::kMaxPortsPerSwitch) + ")");
+        const int allocated = SwitchStore::ConfiguredPortsOnHost(t);
+        if (allocated + numPorts > SwitchLimits::kMaxPortsPerHost)
+            SwitchStore::Refuse(refusal + "its " + std::to_string(numPorts) + " ports and the " +
+                                std::to_string(allocated) + " ports already allocated exceed the host's limit of " +
+                                std::to_string(SwitchLimits::kMaxPortsPerHost));
+        StandardSwitchRecord record;
+        record.name = name;
+        record.numPorts = numPorts;
+        record.policies.teaming = SwitchStore::StorableTeamingPolicy(teaming, "virtual switch " + name);
+        record.policies.security = security;
+        record.policies.shaping = shaping;
+        t.Put(record);
+        return record;
+    });
+    return new VirtualSwitchImpl(std::move(created));
+}
+
+std::vector<Gantry::Network::VirtualSwitch*> VirtualSwitchInfoImpl::GetVirtualSwitches() {
+    std::vector<StandardSwitchRecord> records =
+        kGetVirtualSwitches.Read([](Transaction& t) { return t.List<StandardSwitchRecord>(); });
+    std::vector<Gantry::Network::VirtualSwitch*> switches;
+    for (StandardSwitchRecord& record : records) switches.push_back(new VirtualSwitchImpl(std::move(record)));
+    return switches;
+}
+
+Gantry::Network::VirtualSwitch* VirtualSwitchInfoImpl::GetVirtualSwitchByName(std::string const& name) {
+    std::optional<StandardSwitchRecord> record =
+        kGetVirtualSwitchByName.Read([&](Transaction& t) { return t.Find<StandardSwitchRecord>(name); });
+    return record ? new VirtualSwitchImpl(std::move(*record)) : nullptr;
+}
+
+void VirtualSwitchInfoImpl::RemoveVirtualSwitch(std::string const& name) {
+    kRemoveVirtualSwitch.Write([&](Transaction& t) {
+        SwitchStore::RequireSwitch(t, name);
+        std::vector<PortGroupRecord> groups = SwitchStore::PortGroupsOf(t, name);
+        for (PortGroupRecord const& group : groups)
+            if (SwitchStore::ActiveClientsOf(t, group) > 0)
+                SwitchStore::Refuse("Unable to remove virtual switch " + name + ": its port group " + group.name +
+                                    " has active clients");
+        if (SwitchStore::ClientPortsOf(t, name) > 0)
+            SwitchStore::Refuse("Unable to remove virtual switch " + name + ": it has ports in use");
+        for (PortGroupRecord const& group : groups) t.Erase<PortGroupRecord>(group.name);
+        t.Erase<StandardSwitchRecord>(name);
+    });
+}
+
+}  // namespace Network
+}  // namespace Trellis

@@ -1,0 +1,74 @@
+#include "VirtualSwitchStandardUplinkAdd.h"
+
+#include "gantry/lib/GantryException.h"
+#include "gantry/network/NetworkFactory.h"
+#include "gantry/network/VirtualSwitch.h"
+#include "plinth/callspec/Input.h"
+#include "plinth/callspec/InputSpec.h"
+#include "plinth/callspec/Output.h"
+#include "plinth/callspec/OutputSpec.h"
+#include "plinth/callspec/ParameterSpec.h"
+#include "plinth/metaobj/MetaBool.h"
+
+namespace KorvexCli {
+namespace NetworkNamespace {
+
+VirtualSwitchStandardUplinkAdd::VirtualSwitchStandardUplinkAdd() {
+    SetDescription(
+        "Add an uplink to the given virtual switch. Note if this virtual switch has a NIC teaming policy "
+        "assigned to it then the policy must also be modified to enable use of this uplink on this virtual "
+        "switch");
+    SetMetaDataField("type", "operation");
+}
+
+VirtualSwitchStandardUplinkAdd::~VirtualSwitchStandardUplinkAdd() {}
+
+boost::shared_ptr<VirtualSwitchStandardUplinkAdd> VirtualSwitchStandardUplinkAdd::New() {
+    return boost::shared_ptr<VirtualSwitchStandardUplinkAdd>(new VirtualSwitchStandardUplinkAdd());
+}
+
+boost::shared_ptr<Plinth::CallSpec::InputSpec> VirtualSwitchStandardUplinkAdd::GetInputSpecInternal() {
+    boost::shared_ptr<Plinth::CallSpec::InputSpec> spec = Plinth::CallSpec::InputSpec::New();
+
+    boost::shared_ptr<Plinth::CallSpec::ParameterSpec> vswitchName =
+        Plinth::CallSpec::ParameterSpec::New("vswitch-name", Plinth::CallSpec::PARAMETER_STRING);
+    vswitchName->SetRequired(true);
+    vswitchName->SetShortName("v");
+    vswitchName->SetDescription("The name of the virtual switch to add an uplink to.");
+    spec->AddParameter(vswitchName);
+
+    boost::shared_ptr<Plinth::CallSpec::ParameterSpec> uplinkName =
+        Plinth::CallSpec::ParameterSpec::New("uplink-name", Plinth::CallSpec::PARAMETER_STRING);
+    uplinkName->SetRequired(true);
+    uplinkName->SetShortName("u");
+    uplinkName->SetDescription("The name of the uplink to add to the virtual switch.");
+    spec->AddParameter(uplinkName);
+
+    return spec;
+}
+
+boost::shared_ptr<Plinth::CallSpec::OutputSpec> VirtualSwitchStandardUplinkAdd::GetOutputSpecInternal() {
+    boost::shared_ptr<Plinth::CallSpec::OutputSpec> spec = Plinth::CallSpec::OutputSpec::New();
+    spec->SetResultType(Plinth::MetaObj::MetaBool::New());
+    return spec;
+}
+
+void VirtualSwitchStandardUplinkAdd::ExecuteInternal(boost::shared_ptr<Plinth::CallSpec::Input> input,
+                                                     boost::shared_ptr<Plinth::CallSpec::Output> output) {
+    Gantry::Network::VirtualSwitch* vswitch = nullptr;
+    try {
+        std::string vswitchName = input->GetString("vswitch-name");
+        std::string uplinkName = input->GetString("uplink-name");
+        vswitch = Gantry::Network::NetworkFactory::GetVirtualSwitchById(vswitchName);
+        vswitch->AddUplink(uplinkName);
+        output->SetResult(Plinth::MetaObj::MetaBool::New(true));
+        output->Finish();
+        delete vswitch;
+    } catch (Gantry::Lib::GantryException& e) {
+        delete vswitch;
+        output->SetError(e.GetMessage(0));
+    }
+}
+
+}  // namespace NetworkNamespace
+}  // namespace KorvexCli

@@ -1,0 +1,46 @@
+#pragma once
+
+// Shared by the firewall tests: the host's firewall as its description
+// shows it, and the text of a host failure.
+
+#include <functional>
+#include <string>
+
+#include <nlohmann/json.hpp>
+
+#include "gantry/lib/GantryException.h"
+#include "trellis/host/Description.h"
+
+namespace FirewallTest {
+
+using Json = nlohmann::ordered_json;
+
+// The "firewall" section of the open host.
+inline Json Firewall() { return Json::parse(Trellis::Host::ExportHost())["firewall"]; }
+
+// The stored configuration of one ruleset; null when there is none.
+inline Json Ruleset(const std::string& name) {
+    const Json firewall = Firewall();
+    for (const Json& ruleset : firewall["rulesets"])
+        if (ruleset["name"] == name) return ruleset;
+    return nullptr;
+}
+
+inline bool ModuleLoaded() {
+    const Json host = Json::parse(Trellis::Host::ExportHost());
+    for (const Json& module : host["modules"])
+        if (module["name"] == "haldenfw") return module["loaded"];
+    return false;
+}
+
+// The text of the GantryException that call throws, or "" when it throws none.
+inline std::string FailureOf(const std::function<void()>& call) {
+    try {
+        call();
+    } catch (const Gantry::Lib::GantryException& e) {
+        return e.GetMessage(0);
+    }
+    return "";
+}
+
+}  // namespace FirewallTest
