@@ -1,13 +1,14 @@
 #pragma once
 
 // Shared by the firewall tests: the host's firewall as its description
-// shows it, and the text of a host failure.
+// shows it.
 
 #include <functional>
 #include <string>
 
 #include <nlohmann/json.hpp>
 
+#include "FailureOf.h"
 #include "gantry/lib/GantryException.h"
 #include "trellis/host/Description.h"
 
@@ -31,16 +32,6 @@ inline bool ModuleLoaded() {
     for (const Json& module : host["modules"])
         if (module["name"] == "haldenfw") return module["loaded"];
     return false;
-}
-
-// The text of the GantryException that call throws, or "" when it throws none.
-inline std::string FailureOf(const std::function<void()>& call) {
-    try {
-        call();
-    } catch (const Gantry::Lib::GantryException& e) {
-        return e.GetMessage(0);
-    }
-    return "";
 }
 
 }  // namespace FirewallTest

@@ -7,6 +7,7 @@
 #include <gtest/gtest.h>
 
 #include "ChildProcesses.h"
+#include "FailureOf.h"
 #include "HostTestRecords.h"
 #include "TempHost.h"
 #include "trellis/host/ExecLog.h"
@@ -15,19 +16,6 @@
 
 using namespace Trellis::Host;
 using Trellis::Util::Trellis_Exec;
-
-namespace {
-
-std::string FailureOf(const std::function<void()>& call) {
-    try {
-        call();
-    } catch (const Gantry::Lib::GantryException& e) {
-        return e.what();
-    }
-    return "";
-}
-
-}  // namespace
 
 TEST(HostFaults, BadFaultsAreRefused) {
     TempHost host;

@@ -9,6 +9,7 @@
 
 #include <nlohmann/json.hpp>
 
+#include "FailureOf.h"
 #include "gantry/lib/GantryException.h"
 #include "trellis/host/Description.h"
 
@@ -40,16 +41,6 @@ inline Json SwitchEntry(const std::string& name, int numPorts, const Json& uplin
 
 inline Json PortGroupEntry(const std::string& name, const std::string& vswitch, int vlanId = 0) {
     return Json{{"name", name}, {"vswitch", vswitch}, {"vlanId", vlanId}};
-}
-
-// The text of the GantryException that call throws, or "" when it throws none.
-inline std::string FailureOf(const std::function<void()>& call) {
-    try {
-        call();
-    } catch (const Gantry::Lib::GantryException& e) {
-        return e.GetMessage(0);
-    }
-    return "";
 }
 
 }  // namespace SwitchTest
