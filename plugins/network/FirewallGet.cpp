@@ -28,9 +28,9 @@ boost::shared_ptr<Plinth::CallSpec::InputSpec> FirewallGet::GetInputSpecInternal
 }
 
 boost::shared_ptr<Plinth::CallSpec::OutputSpec> FirewallGet::GetOutputSpecInternal() {
-    boost::shared_ptr<Plinth::CallSpec::OutputSpec> spec = Plinth::CallSpec::OutputSpec::New();
-    spec->SetResultType(GetOutputStructure());
-    return spec;
+    boost::shared_ptr<Plinth::CallSpec::OutputSpec> outputSpec = Plinth::CallSpec::OutputSpec::New();
+    outputSpec->SetResultType(GetOutputStructure());
+    return outputSpec;
 }
 
 boost::shared_ptr<Plinth::MetaObj::MetaStruct> FirewallGet::GetOutputStructure() {

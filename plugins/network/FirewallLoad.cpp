@@ -25,9 +25,9 @@ boost::shared_ptr<Plinth::CallSpec::InputSpec> FirewallLoad::GetInputSpecInterna
 }
 
 boost::shared_ptr<Plinth::CallSpec::OutputSpec> FirewallLoad::GetOutputSpecInternal() {
-    boost::shared_ptr<Plinth::CallSpec::OutputSpec> spec = Plinth::CallSpec::OutputSpec::New();
-    spec->SetResultType(Plinth::MetaObj::MetaBool::New());
-    return spec;
+    boost::shared_ptr<Plinth::CallSpec::OutputSpec> outputSpec = Plinth::CallSpec::OutputSpec::New();
+    outputSpec->SetResultType(Plinth::MetaObj::MetaBool::New());
+    return outputSpec;
 }
 
 void FirewallLoad::ExecuteInternal(boost::shared_ptr<Plinth::CallSpec::Input> /*input*/,

@@ -30,9 +30,9 @@ boost::shared_ptr<Plinth::CallSpec::InputSpec> FirewallRefresh::GetInputSpecInte
 }
 
 boost::shared_ptr<Plinth::CallSpec::OutputSpec> FirewallRefresh::GetOutputSpecInternal() {
-    boost::shared_ptr<Plinth::CallSpec::OutputSpec> spec = Plinth::CallSpec::OutputSpec::New();
-    spec->SetResultType(Plinth::MetaObj::MetaBool::New());
-    return spec;
+    boost::shared_ptr<Plinth::CallSpec::OutputSpec> outputSpec = Plinth::CallSpec::OutputSpec::New();
+    outputSpec->SetResultType(Plinth::MetaObj::MetaBool::New());
+    return outputSpec;
 }
 
 void FirewallRefresh::ExecuteInternal(boost::shared_ptr<Plinth::CallSpec::Input> /*input*/,

@@ -27,29 +27,29 @@ boost::shared_ptr<FirewallRulesetAllowedipAdd> FirewallRulesetAllowedipAdd::New(
 }
 
 boost::shared_ptr<Plinth::CallSpec::InputSpec> FirewallRulesetAllowedipAdd::GetInputSpecInternal() {
-    boost::shared_ptr<Plinth::CallSpec::InputSpec> spec = Plinth::CallSpec::InputSpec::New();
+    boost::shared_ptr<Plinth::CallSpec::InputSpec> inputSpec = Plinth::CallSpec::InputSpec::New();
 
     boost::shared_ptr<Plinth::CallSpec::ParameterSpec> rulesetId =
         Plinth::CallSpec::ParameterSpec::New("ruleset-id", Plinth::CallSpec::PARAMETER_STRING);
     rulesetId->SetRequired(true);
     rulesetId->SetShortName("r");
     rulesetId->SetDescription("The label of the ruleset.");
-    spec->AddParameter(rulesetId);
+    inputSpec->AddParameter(rulesetId);
 
     boost::shared_ptr<Plinth::CallSpec::ParameterSpec> ipAddress =
         Plinth::CallSpec::ParameterSpec::New("ip-address", Plinth::CallSpec::PARAMETER_STRING);
     ipAddress->SetRequired(true);
     ipAddress->SetShortName("i");
     ipAddress->SetDescription("Allowed ip address/range for the ruleset.");
-    spec->AddParameter(ipAddress);
+    inputSpec->AddParameter(ipAddress);
 
-    return spec;
+    return inputSpec;
 }
 
 boost::shared_ptr<Plinth::CallSpec::OutputSpec> FirewallRulesetAllowedipAdd::GetOutputSpecInternal() {
-    boost::shared_ptr<Plinth::CallSpec::OutputSpec> spec = Plinth::CallSpec::OutputSpec::New();
-    spec->SetResultType(Plinth::MetaObj::MetaBool::New());
-    return spec;
+    boost::shared_ptr<Plinth::CallSpec::OutputSpec> outputSpec = Plinth::CallSpec::OutputSpec::New();
+    outputSpec->SetResultType(Plinth::MetaObj::MetaBool::New());
+    return outputSpec;
 }
 
 void FirewallRulesetAllowedipAdd::ExecuteInternal(boost::shared_ptr<Plinth::CallSpec::Input> input,

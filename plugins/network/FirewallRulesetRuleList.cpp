@@ -36,22 +36,22 @@ boost::shared_ptr<FirewallRulesetRuleList> FirewallRulesetRuleList::New() {
 }
 
 boost::shared_ptr<Plinth::CallSpec::InputSpec> FirewallRulesetRuleList::GetInputSpecInternal() {
-    boost::shared_ptr<Plinth::CallSpec::InputSpec> spec = Plinth::CallSpec::InputSpec::New();
+    boost::shared_ptr<Plinth::CallSpec::InputSpec> inputSpec = Plinth::CallSpec::InputSpec::New();
 
     boost::shared_ptr<Plinth::CallSpec::ParameterSpec> rulesetId =
         Plinth::CallSpec::ParameterSpec::New("ruleset-id", Plinth::CallSpec::PARAMETER_STRING);
     rulesetId->SetRequired(false);
     rulesetId->SetShortName("r");
     rulesetId->SetDescription("List rules for specfic ruleset");
-    spec->AddParameter(rulesetId);
+    inputSpec->AddParameter(rulesetId);
 
-    return spec;
+    return inputSpec;
 }
 
 boost::shared_ptr<Plinth::CallSpec::OutputSpec> FirewallRulesetRuleList::GetOutputSpecInternal() {
-    boost::shared_ptr<Plinth::CallSpec::OutputSpec> spec = Plinth::CallSpec::OutputSpec::New();
-    spec->SetResultType(Plinth::MetaObj::MetaList::New(3, GetOutputStructure()));
-    return spec;
+    boost::shared_ptr<Plinth::CallSpec::OutputSpec> outputSpec = Plinth::CallSpec::OutputSpec::New();
+    outputSpec->SetResultType(Plinth::MetaObj::MetaList::New(3, GetOutputStructure()));
+    return outputSpec;
 }
 
 boost::shared_ptr<Plinth::MetaObj::MetaStruct> FirewallRulesetRuleList::GetOutputStructure() {

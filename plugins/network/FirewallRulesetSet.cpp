@@ -27,36 +27,36 @@ boost::shared_ptr<FirewallRulesetSet> FirewallRulesetSet::New() {
 }
 
 boost::shared_ptr<Plinth::CallSpec::InputSpec> FirewallRulesetSet::GetInputSpecInternal() {
-    boost::shared_ptr<Plinth::CallSpec::InputSpec> spec = Plinth::CallSpec::InputSpec::New();
+    boost::shared_ptr<Plinth::CallSpec::InputSpec> inputSpec = Plinth::CallSpec::InputSpec::New();
 
     boost::shared_ptr<Plinth::CallSpec::ParameterSpec> rulesetId =
         Plinth::CallSpec::ParameterSpec::New("ruleset-id", Plinth::CallSpec::PARAMETER_STRING);
     rulesetId->SetRequired(true);
     rulesetId->SetShortName("r");
     rulesetId->SetDescription("The label of the ruleset.");
-    spec->AddParameter(rulesetId);
+    inputSpec->AddParameter(rulesetId);
 
     boost::shared_ptr<Plinth::CallSpec::ParameterSpec> allowedAll =
         Plinth::CallSpec::ParameterSpec::New("allowed-all", Plinth::CallSpec::PARAMETER_BOOL);
     allowedAll->SetRequired(false);
     allowedAll->SetShortName("a");
     allowedAll->SetDescription("Set to true to allowed all ip, set to false to use allowed ip list.");
-    spec->AddParameter(allowedAll);
+    inputSpec->AddParameter(allowedAll);
 
     boost::shared_ptr<Plinth::CallSpec::ParameterSpec> enabled =
         Plinth::CallSpec::ParameterSpec::New("enabled", Plinth::CallSpec::PARAMETER_BOOL);
     enabled->SetRequired(false);
     enabled->SetShortName("e");
     enabled->SetDescription("Set to true to enable ruleset, set to false to disable it.");
-    spec->AddParameter(enabled);
+    inputSpec->AddParameter(enabled);
 
-    return spec;
+    return inputSpec;
 }
 
 boost::shared_ptr<Plinth::CallSpec::OutputSpec> FirewallRulesetSet::GetOutputSpecInternal() {
-    boost::shared_ptr<Plinth::CallSpec::OutputSpec> spec = Plinth::CallSpec::OutputSpec::New();
-    spec->SetResultType(Plinth::MetaObj::MetaBool::New());
-    return spec;
+    boost::shared_ptr<Plinth::CallSpec::OutputSpec> outputSpec = Plinth::CallSpec::OutputSpec::New();
+    outputSpec->SetResultType(Plinth::MetaObj::MetaBool::New());
+    return outputSpec;
 }
 
 void FirewallRulesetSet::ExecuteInternal(boost::shared_ptr<Plinth::CallSpec::Input> input,

@@ -23,29 +23,29 @@ FirewallSet::~FirewallSet() {}
 boost::shared_ptr<FirewallSet> FirewallSet::New() { return boost::shared_ptr<FirewallSet>(new FirewallSet()); }
 
 boost::shared_ptr<Plinth::CallSpec::InputSpec> FirewallSet::GetInputSpecInternal() {
-    boost::shared_ptr<Plinth::CallSpec::InputSpec> spec = Plinth::CallSpec::InputSpec::New();
+    boost::shared_ptr<Plinth::CallSpec::InputSpec> inputSpec = Plinth::CallSpec::InputSpec::New();
 
     boost::shared_ptr<Plinth::CallSpec::ParameterSpec> enabled =
         Plinth::CallSpec::ParameterSpec::New("enabled", Plinth::CallSpec::PARAMETER_BOOL);
     enabled->SetRequired(false);
     enabled->SetShortName("e");
     enabled->SetDescription("Set to true to enable the firewall, set to false to disable the firewall.");
-    spec->AddParameter(enabled);
+    inputSpec->AddParameter(enabled);
 
     boost::shared_ptr<Plinth::CallSpec::ParameterSpec> defaultAction =
         Plinth::CallSpec::ParameterSpec::New("default-action", Plinth::CallSpec::PARAMETER_BOOL);
     defaultAction->SetRequired(false);
     defaultAction->SetShortName("d");
     defaultAction->SetDescription("Set to true to set defaultaction PASS, set to false to DROP.");
-    spec->AddParameter(defaultAction);
+    inputSpec->AddParameter(defaultAction);
 
-    return spec;
+    return inputSpec;
 }
 
 boost::shared_ptr<Plinth::CallSpec::OutputSpec> FirewallSet::GetOutputSpecInternal() {
-    boost::shared_ptr<Plinth::CallSpec::OutputSpec> spec = Plinth::CallSpec::OutputSpec::New();
-    spec->SetResultType(Plinth::MetaObj::MetaBool::New());
-    return spec;
+    boost::shared_ptr<Plinth::CallSpec::OutputSpec> outputSpec = Plinth::CallSpec::OutputSpec::New();
+    outputSpec->SetResultType(Plinth::MetaObj::MetaBool::New());
+    return outputSpec;
 }
 
 void FirewallSet::ExecuteInternal(boost::shared_ptr<Plinth::CallSpec::Input> input,

@@ -27,9 +27,9 @@ boost::shared_ptr<Plinth::CallSpec::InputSpec> FirewallUnload::GetInputSpecInter
 }
 
 boost::shared_ptr<Plinth::CallSpec::OutputSpec> FirewallUnload::GetOutputSpecInternal() {
-    boost::shared_ptr<Plinth::CallSpec::OutputSpec> spec = Plinth::CallSpec::OutputSpec::New();
-    spec->SetResultType(Plinth::MetaObj::MetaBool::New());
-    return spec;
+    boost::shared_ptr<Plinth::CallSpec::OutputSpec> outputSpec = Plinth::CallSpec::OutputSpec::New();
+    outputSpec->SetResultType(Plinth::MetaObj::MetaBool::New());
+    return outputSpec;
 }
 
 void FirewallUnload::ExecuteInternal(boost::shared_ptr<Plinth::CallSpec::Input> /*input*/,

@@ -29,7 +29,7 @@ boost::shared_ptr<ParameterSpec> OptionalParameter(std::string const& name, Para
 
 }  // namespace
 
-void AddFailoverParameters(boost::shared_ptr<InputSpec> spec) {
+void AddFailoverParameters(boost::shared_ptr<InputSpec> inputSpec) {
     boost::shared_ptr<ParameterSpec> loadBalancing = OptionalParameter(
         "load-balancing", Plinth::CallSpec::PARAMETER_STRING, "l",
         "Set the load balancing policy for this policy. This can be one of the following options: "
@@ -43,7 +43,7 @@ void AddFailoverParameters(boost::shared_ptr<InputSpec> spec) {
                                   "Always use the highest order uplink from the list of active adapters "
                                   "which pass failover criteria.");
     loadBalancing->SetConstraint(balancingWords);
-    spec->AddParameter(loadBalancing);
+    inputSpec->AddParameter(loadBalancing);
 
     boost::shared_ptr<ParameterSpec> failureDetection = OptionalParameter(
         "failure-detection", Plinth::CallSpec::PARAMETER_STRING, "f",
@@ -53,39 +53,39 @@ void AddFailoverParameters(boost::shared_ptr<InputSpec> spec) {
     detectionWords->AddStringEnum("link", "Detect failures based on the NIC link state");
     detectionWords->AddStringEnum("beacon", "Detect failures based on active beaconing to the vswitch");
     failureDetection->SetConstraint(detectionWords);
-    spec->AddParameter(failureDetection);
+    inputSpec->AddParameter(failureDetection);
 
-    spec->AddParameter(OptionalParameter(
+    inputSpec->AddParameter(OptionalParameter(
         "notify-switches", Plinth::CallSpec::PARAMETER_BOOL, "n",
         "Indicate whether to send a notification to physical switches on failover"));
-    spec->AddParameter(OptionalParameter(
+    inputSpec->AddParameter(OptionalParameter(
         "failback", Plinth::CallSpec::PARAMETER_BOOL, "b",
         "Configure whether a NIC will be used immediately when it comes back in service after a "
         "failover"));
-    spec->AddParameter(OptionalParameter(
+    inputSpec->AddParameter(OptionalParameter(
         "active-uplinks", Plinth::CallSpec::PARAMETER_STRING, "a",
         "Configure the list of active adapters and their failover order. This list must be a comma "
         "seperated list of values with the uplink name and no spaces. Example:  "
         "--active-uplinks=pnet0,pnet3,pnet7,pnet1"));
-    spec->AddParameter(OptionalParameter(
+    inputSpec->AddParameter(OptionalParameter(
         "standby-uplinks", Plinth::CallSpec::PARAMETER_STRING, "s",
         "Configure the list of standby adapters and their failover order. This list must be a comma "
         "seperated list of values with the uplink name and no spaces. Example:  "
         "--standby-uplinks=pnet2,pnet4,pnet8,pnet6,pnet11"));
 }
 
-void AddSecurityParameters(boost::shared_ptr<InputSpec> spec) {
-    spec->AddParameter(OptionalParameter("allow-promiscuous", Plinth::CallSpec::PARAMETER_BOOL, "o",
+void AddSecurityParameters(boost::shared_ptr<InputSpec> inputSpec) {
+    inputSpec->AddParameter(OptionalParameter("allow-promiscuous", Plinth::CallSpec::PARAMETER_BOOL, "o",
                                          "Allow ports on the virtual switch to enter promiscuous mode."));
-    spec->AddParameter(OptionalParameter("allow-mac-change", Plinth::CallSpec::PARAMETER_BOOL, "m",
+    inputSpec->AddParameter(OptionalParameter("allow-mac-change", Plinth::CallSpec::PARAMETER_BOOL, "m",
                                          "Allow ports on the virtual switch to change their MAC address."));
-    spec->AddParameter(OptionalParameter(
+    inputSpec->AddParameter(OptionalParameter(
         "allow-forged-transmits", Plinth::CallSpec::PARAMETER_BOOL, "f",
         "Allow ports on the virtual switch to send packets with forged source information."));
 }
 
-void AddShapingParameters(boost::shared_ptr<InputSpec> spec) {
-    spec->AddParameter(OptionalParameter(
+void AddShapingParameters(boost::shared_ptr<InputSpec> inputSpec) {
+    inputSpec->AddParameter(OptionalParameter(
         "enabled", Plinth::CallSpec::PARAMETER_BOOL, "e",
         "Indicate whether to enable traffic shaping on this policy. If this is true then the "
         "--avg-bandwidth, --peak-bandwidth and --burst-size options are required."));
@@ -99,21 +99,21 @@ void AddShapingParameters(boost::shared_ptr<InputSpec> spec) {
         "The averge bandwidth allowed for this shaping policy. This value is in Kbps (1 Kbps = 1000 "
         "bits/s)");
     average->SetConstraint(positive);
-    spec->AddParameter(average);
+    inputSpec->AddParameter(average);
 
     boost::shared_ptr<ParameterSpec> peak = OptionalParameter(
         "peak-bandwidth", Plinth::CallSpec::PARAMETER_INT, "k",
         "The peak bandwidth allowed for this shaping policy. This value is in Kbps (1 Kbps = 1000 "
         "bits/s)");
     peak->SetConstraint(positive);
-    spec->AddParameter(peak);
+    inputSpec->AddParameter(peak);
 
     boost::shared_ptr<ParameterSpec> burst = OptionalParameter(
         "burst-size", Plinth::CallSpec::PARAMETER_INT, "t",
         "The largest burst size allowed for this shaping policy. This value is in Kib (1 Kib = 1024 "
         "bits)");
     burst->SetConstraint(positive);
-    spec->AddParameter(burst);
+    inputSpec->AddParameter(burst);
 }
 
 }  // namespace NetworkNamespace

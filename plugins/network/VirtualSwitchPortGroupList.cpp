@@ -35,9 +35,9 @@ boost::shared_ptr<Plinth::CallSpec::InputSpec> VirtualSwitchPortGroupList::GetIn
 }
 
 boost::shared_ptr<Plinth::CallSpec::OutputSpec> VirtualSwitchPortGroupList::GetOutputSpecInternal() {
-    boost::shared_ptr<Plinth::CallSpec::OutputSpec> spec = Plinth::CallSpec::OutputSpec::New();
-    spec->SetResultType(Plinth::MetaObj::MetaList::New(Plinth::MetaObj::META_STRUCT, GetOutputStructure()));
-    return spec;
+    boost::shared_ptr<Plinth::CallSpec::OutputSpec> outputSpec = Plinth::CallSpec::OutputSpec::New();
+    outputSpec->SetResultType(Plinth::MetaObj::MetaList::New(Plinth::MetaObj::META_STRUCT, GetOutputStructure()));
+    return outputSpec;
 }
 
 boost::shared_ptr<Plinth::MetaObj::MetaStruct> VirtualSwitchPortGroupList::GetOutputStructure() {

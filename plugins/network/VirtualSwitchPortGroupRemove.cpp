@@ -25,29 +25,29 @@ boost::shared_ptr<VirtualSwitchPortGroupRemove> VirtualSwitchPortGroupRemove::Ne
 }
 
 boost::shared_ptr<Plinth::CallSpec::InputSpec> VirtualSwitchPortGroupRemove::GetInputSpecInternal() {
-    boost::shared_ptr<Plinth::CallSpec::InputSpec> spec = Plinth::CallSpec::InputSpec::New();
+    boost::shared_ptr<Plinth::CallSpec::InputSpec> inputSpec = Plinth::CallSpec::InputSpec::New();
 
     boost::shared_ptr<Plinth::CallSpec::ParameterSpec> portGroupName =
         Plinth::CallSpec::ParameterSpec::New("portgroup-name", Plinth::CallSpec::PARAMETER_STRING);
     portGroupName->SetRequired(true);
     portGroupName->SetShortName("p");
     portGroupName->SetDescription(" ");
-    spec->AddParameter(portGroupName);
+    inputSpec->AddParameter(portGroupName);
 
     boost::shared_ptr<Plinth::CallSpec::ParameterSpec> vswitchName =
         Plinth::CallSpec::ParameterSpec::New("vswitch-name", Plinth::CallSpec::PARAMETER_STRING);
     vswitchName->SetRequired(true);
     vswitchName->SetShortName("v");
     vswitchName->SetDescription(" ");
-    spec->AddParameter(vswitchName);
+    inputSpec->AddParameter(vswitchName);
 
-    return spec;
+    return inputSpec;
 }
 
 boost::shared_ptr<Plinth::CallSpec::OutputSpec> VirtualSwitchPortGroupRemove::GetOutputSpecInternal() {
-    boost::shared_ptr<Plinth::CallSpec::OutputSpec> spec = Plinth::CallSpec::OutputSpec::New();
-    spec->SetResultType(Plinth::MetaObj::MetaBool::New());
-    return spec;
+    boost::shared_ptr<Plinth::CallSpec::OutputSpec> outputSpec = Plinth::CallSpec::OutputSpec::New();
+    outputSpec->SetResultType(Plinth::MetaObj::MetaBool::New());
+    return outputSpec;
 }
 
 void VirtualSwitchPortGroupRemove::ExecuteInternal(boost::shared_ptr<Plinth::CallSpec::Input> input,

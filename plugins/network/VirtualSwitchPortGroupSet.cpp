@@ -28,14 +28,14 @@ boost::shared_ptr<VirtualSwitchPortGroupSet> VirtualSwitchPortGroupSet::New() {
 }
 
 boost::shared_ptr<Plinth::CallSpec::InputSpec> VirtualSwitchPortGroupSet::GetInputSpecInternal() {
-    boost::shared_ptr<Plinth::CallSpec::InputSpec> spec = Plinth::CallSpec::InputSpec::New();
+    boost::shared_ptr<Plinth::CallSpec::InputSpec> inputSpec = Plinth::CallSpec::InputSpec::New();
 
     boost::shared_ptr<Plinth::CallSpec::ParameterSpec> portGroupName =
         Plinth::CallSpec::ParameterSpec::New("portgroup-name", Plinth::CallSpec::PARAMETER_STRING);
     portGroupName->SetRequired(true);
     portGroupName->SetShortName("p");
     portGroupName->SetDescription("The name of the port group to set vlan id for.");
-    spec->AddParameter(portGroupName);
+    inputSpec->AddParameter(portGroupName);
 
     boost::shared_ptr<Plinth::CallSpec::ParameterSpec> vlanId =
         Plinth::CallSpec::ParameterSpec::New("vlan-id", Plinth::CallSpec::PARAMETER_INT);
@@ -48,15 +48,15 @@ boost::shared_ptr<Plinth::CallSpec::InputSpec> VirtualSwitchPortGroupSet::GetInp
         Plinth::CallSpec::ParameterConstraint::New(Plinth::CallSpec::CONSTRAINT_INT_RANGE);
     vlanRange->SetIntRange(Gantry::Network::PortGroup::MIN_VLAN_ID, Gantry::Network::PortGroup::MAX_VLAN_ID);
     vlanId->SetConstraint(vlanRange);
-    spec->AddParameter(vlanId);
+    inputSpec->AddParameter(vlanId);
 
-    return spec;
+    return inputSpec;
 }
 
 boost::shared_ptr<Plinth::CallSpec::OutputSpec> VirtualSwitchPortGroupSet::GetOutputSpecInternal() {
-    boost::shared_ptr<Plinth::CallSpec::OutputSpec> spec = Plinth::CallSpec::OutputSpec::New();
-    spec->SetResultType(Plinth::MetaObj::MetaBool::New());
-    return spec;
+    boost::shared_ptr<Plinth::CallSpec::OutputSpec> outputSpec = Plinth::CallSpec::OutputSpec::New();
+    outputSpec->SetResultType(Plinth::MetaObj::MetaBool::New());
+    return outputSpec;
 }
 
 void VirtualSwitchPortGroupSet::ExecuteInternal(boost::shared_ptr<Plinth::CallSpec::Input> input,

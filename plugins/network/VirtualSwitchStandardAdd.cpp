@@ -31,14 +31,14 @@ boost::shared_ptr<VirtualSwitchStandardAdd> VirtualSwitchStandardAdd::New() {
 }
 
 boost::shared_ptr<Plinth::CallSpec::InputSpec> VirtualSwitchStandardAdd::GetInputSpecInternal() {
-    boost::shared_ptr<Plinth::CallSpec::InputSpec> spec = Plinth::CallSpec::InputSpec::New();
+    boost::shared_ptr<Plinth::CallSpec::InputSpec> inputSpec = Plinth::CallSpec::InputSpec::New();
 
     boost::shared_ptr<Plinth::CallSpec::ParameterSpec> vswitchName =
         Plinth::CallSpec::ParameterSpec::New("vswitch-name", Plinth::CallSpec::PARAMETER_STRING);
     vswitchName->SetRequired(true);
     vswitchName->SetShortName("v");
     vswitchName->SetDescription("The name of the virtual switch to create.");
-    spec->AddParameter(vswitchName);
+    inputSpec->AddParameter(vswitchName);
 
     boost::shared_ptr<Plinth::CallSpec::ParameterSpec> ports =
         Plinth::CallSpec::ParameterSpec::New("ports", Plinth::CallSpec::PARAMETER_INT);
@@ -52,15 +52,15 @@ boost::shared_ptr<Plinth::CallSpec::InputSpec> VirtualSwitchStandardAdd::GetInpu
         Plinth::CallSpec::ParameterConstraint::New(Plinth::CallSpec::CONSTRAINT_INT_RANGE);
     portsRange->SetIntRange(1, 4096);
     ports->SetConstraint(portsRange);
-    spec->AddParameter(ports);
+    inputSpec->AddParameter(ports);
 
-    return spec;
+    return inputSpec;
 }
 
 boost::shared_ptr<Plinth::CallSpec::OutputSpec> VirtualSwitchStandardAdd::GetOutputSpecInternal() {
-    boost::shared_ptr<Plinth::CallSpec::OutputSpec> spec = Plinth::CallSpec::OutputSpec::New();
-    spec->SetResultType(Plinth::MetaObj::MetaBool::New());
-    return spec;
+    boost::shared_ptr<Plinth::CallSpec::OutputSpec> outputSpec = Plinth::CallSpec::OutputSpec::New();
+    outputSpec->SetResultType(Plinth::MetaObj::MetaBool::New());
+    return outputSpec;
 }
 
 void VirtualSwitchStandardAdd::ExecuteInternal(boost::shared_ptr<Plinth::CallSpec::Input> input,

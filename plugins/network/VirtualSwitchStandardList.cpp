@@ -42,22 +42,22 @@ boost::shared_ptr<VirtualSwitchStandardList> VirtualSwitchStandardList::New() {
 }
 
 boost::shared_ptr<Plinth::CallSpec::InputSpec> VirtualSwitchStandardList::GetInputSpecInternal() {
-    boost::shared_ptr<Plinth::CallSpec::InputSpec> spec = Plinth::CallSpec::InputSpec::New();
+    boost::shared_ptr<Plinth::CallSpec::InputSpec> inputSpec = Plinth::CallSpec::InputSpec::New();
 
     boost::shared_ptr<Plinth::CallSpec::ParameterSpec> vswitchName =
         Plinth::CallSpec::ParameterSpec::New("vswitch-name", Plinth::CallSpec::PARAMETER_STRING);
     vswitchName->SetRequired(false);
     vswitchName->SetShortName("v");
     vswitchName->SetDescription("Limit the output of this command to only virtual switches with the given name.");
-    spec->AddParameter(vswitchName);
+    inputSpec->AddParameter(vswitchName);
 
-    return spec;
+    return inputSpec;
 }
 
 boost::shared_ptr<Plinth::CallSpec::OutputSpec> VirtualSwitchStandardList::GetOutputSpecInternal() {
-    boost::shared_ptr<Plinth::CallSpec::OutputSpec> spec = Plinth::CallSpec::OutputSpec::New();
-    spec->SetResultType(Plinth::MetaObj::MetaList::New(Plinth::MetaObj::META_STRUCT, GetOutputStructure()));
-    return spec;
+    boost::shared_ptr<Plinth::CallSpec::OutputSpec> outputSpec = Plinth::CallSpec::OutputSpec::New();
+    outputSpec->SetResultType(Plinth::MetaObj::MetaList::New(Plinth::MetaObj::META_STRUCT, GetOutputStructure()));
+    return outputSpec;
 }
 
 boost::shared_ptr<Plinth::MetaObj::MetaStruct> VirtualSwitchStandardList::GetOutputStructure() {

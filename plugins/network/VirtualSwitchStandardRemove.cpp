@@ -25,22 +25,22 @@ boost::shared_ptr<VirtualSwitchStandardRemove> VirtualSwitchStandardRemove::New(
 }
 
 boost::shared_ptr<Plinth::CallSpec::InputSpec> VirtualSwitchStandardRemove::GetInputSpecInternal() {
-    boost::shared_ptr<Plinth::CallSpec::InputSpec> spec = Plinth::CallSpec::InputSpec::New();
+    boost::shared_ptr<Plinth::CallSpec::InputSpec> inputSpec = Plinth::CallSpec::InputSpec::New();
 
     boost::shared_ptr<Plinth::CallSpec::ParameterSpec> vswitchName =
         Plinth::CallSpec::ParameterSpec::New("vswitch-name", Plinth::CallSpec::PARAMETER_STRING);
     vswitchName->SetRequired(true);
     vswitchName->SetShortName("v");
     vswitchName->SetDescription("The name of the virtual switch to remove.");
-    spec->AddParameter(vswitchName);
+    inputSpec->AddParameter(vswitchName);
 
-    return spec;
+    return inputSpec;
 }
 
 boost::shared_ptr<Plinth::CallSpec::OutputSpec> VirtualSwitchStandardRemove::GetOutputSpecInternal() {
-    boost::shared_ptr<Plinth::CallSpec::OutputSpec> spec = Plinth::CallSpec::OutputSpec::New();
-    spec->SetResultType(Plinth::MetaObj::MetaBool::New());
-    return spec;
+    boost::shared_ptr<Plinth::CallSpec::OutputSpec> outputSpec = Plinth::CallSpec::OutputSpec::New();
+    outputSpec->SetResultType(Plinth::MetaObj::MetaBool::New());
+    return outputSpec;
 }
 
 void VirtualSwitchStandardRemove::ExecuteInternal(boost::shared_ptr<Plinth::CallSpec::Input> input,

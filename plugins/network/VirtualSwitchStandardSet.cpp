@@ -28,21 +28,21 @@ boost::shared_ptr<VirtualSwitchStandardSet> VirtualSwitchStandardSet::New() {
 }
 
 boost::shared_ptr<Plinth::CallSpec::InputSpec> VirtualSwitchStandardSet::GetInputSpecInternal() {
-    boost::shared_ptr<Plinth::CallSpec::InputSpec> spec = Plinth::CallSpec::InputSpec::New();
+    boost::shared_ptr<Plinth::CallSpec::InputSpec> inputSpec = Plinth::CallSpec::InputSpec::New();
 
     boost::shared_ptr<Plinth::CallSpec::ParameterSpec> vswitchName =
         Plinth::CallSpec::ParameterSpec::New("vswitch-name", Plinth::CallSpec::PARAMETER_STRING);
     vswitchName->SetRequired(true);
     vswitchName->SetShortName("v");
     vswitchName->SetDescription("The name of virtual switch to apply the configurations.");
-    spec->AddParameter(vswitchName);
+    inputSpec->AddParameter(vswitchName);
 
     boost::shared_ptr<Plinth::CallSpec::ParameterSpec> mtu =
         Plinth::CallSpec::ParameterSpec::New("mtu", Plinth::CallSpec::PARAMETER_INT);
     mtu->SetRequired(false);
     mtu->SetShortName("m");
     mtu->SetDescription("The MTU size of the given virtual switch.");
-    spec->AddParameter(mtu);
+    inputSpec->AddParameter(mtu);
 
     boost::shared_ptr<Plinth::CallSpec::ParameterSpec> cdpStatus =
         Plinth::CallSpec::ParameterSpec::New("cdp-status", Plinth::CallSpec::PARAMETER_STRING);
@@ -57,15 +57,15 @@ boost::shared_ptr<Plinth::CallSpec::InputSpec> VirtualSwitchStandardSet::GetInpu
     cdpWords->AddStringEnum("advertise", "CDP status is 'advertise'");
     cdpWords->AddStringEnum("both", "CDP status is 'both'");
     cdpStatus->SetConstraint(cdpWords);
-    spec->AddParameter(cdpStatus);
+    inputSpec->AddParameter(cdpStatus);
 
-    return spec;
+    return inputSpec;
 }
 
 boost::shared_ptr<Plinth::CallSpec::OutputSpec> VirtualSwitchStandardSet::GetOutputSpecInternal() {
-    boost::shared_ptr<Plinth::CallSpec::OutputSpec> spec = Plinth::CallSpec::OutputSpec::New();
-    spec->SetResultType(Plinth::MetaObj::MetaBool::New());
-    return spec;
+    boost::shared_ptr<Plinth::CallSpec::OutputSpec> outputSpec = Plinth::CallSpec::OutputSpec::New();
+    outputSpec->SetResultType(Plinth::MetaObj::MetaBool::New());
+    return outputSpec;
 }
 
 void VirtualSwitchStandardSet::ExecuteInternal(boost::shared_ptr<Plinth::CallSpec::Input> input,

@@ -28,29 +28,29 @@ boost::shared_ptr<VirtualSwitchStandardUplinkAdd> VirtualSwitchStandardUplinkAdd
 }
 
 boost::shared_ptr<Plinth::CallSpec::InputSpec> VirtualSwitchStandardUplinkAdd::GetInputSpecInternal() {
-    boost::shared_ptr<Plinth::CallSpec::InputSpec> spec = Plinth::CallSpec::InputSpec::New();
+    boost::shared_ptr<Plinth::CallSpec::InputSpec> inputSpec = Plinth::CallSpec::InputSpec::New();
 
     boost::shared_ptr<Plinth::CallSpec::ParameterSpec> vswitchName =
         Plinth::CallSpec::ParameterSpec::New("vswitch-name", Plinth::CallSpec::PARAMETER_STRING);
     vswitchName->SetRequired(true);
     vswitchName->SetShortName("v");
     vswitchName->SetDescription("The name of the virtual switch to add an uplink to.");
-    spec->AddParameter(vswitchName);
+    inputSpec->AddParameter(vswitchName);
 
     boost::shared_ptr<Plinth::CallSpec::ParameterSpec> uplinkName =
         Plinth::CallSpec::ParameterSpec::New("uplink-name", Plinth::CallSpec::PARAMETER_STRING);
     uplinkName->SetRequired(true);
     uplinkName->SetShortName("u");
     uplinkName->SetDescription("The name of the uplink to add to the virtual switch.");
-    spec->AddParameter(uplinkName);
+    inputSpec->AddParameter(uplinkName);
 
-    return spec;
+    return inputSpec;
 }
 
 boost::shared_ptr<Plinth::CallSpec::OutputSpec> VirtualSwitchStandardUplinkAdd::GetOutputSpecInternal() {
-    boost::shared_ptr<Plinth::CallSpec::OutputSpec> spec = Plinth::CallSpec::OutputSpec::New();
-    spec->SetResultType(Plinth::MetaObj::MetaBool::New());
-    return spec;
+    boost::shared_ptr<Plinth::CallSpec::OutputSpec> outputSpec = Plinth::CallSpec::OutputSpec::New();
+    outputSpec->SetResultType(Plinth::MetaObj::MetaBool::New());
+    return outputSpec;
 }
 
 void VirtualSwitchStandardUplinkAdd::ExecuteInternal(boost::shared_ptr<Plinth::CallSpec::Input> input,

@@ -32,54 +32,54 @@ Echo::Echo() {
 }
 
 boost::shared_ptr<InputSpec> Echo::GetInputSpecInternal() {
-    boost::shared_ptr<InputSpec> spec = InputSpec::New();
+    boost::shared_ptr<InputSpec> inputSpec = InputSpec::New();
 
     boost::shared_ptr<ParameterSpec> name = Parameter("name", PARAMETER_STRING, "n", "The name to echo.");
     name->SetRequired(true);
-    spec->AddParameter(name);
+    inputSpec->AddParameter(name);
 
     boost::shared_ptr<ParameterSpec> port = Parameter("port", PARAMETER_INT, "p", "A port number.");
     boost::shared_ptr<ParameterConstraint> range = ParameterConstraint::New(CONSTRAINT_INT_RANGE);
     range->SetIntRange(1, 4096);
     port->SetConstraint(range);
-    spec->AddParameter(port);
+    inputSpec->AddParameter(port);
 
     boost::shared_ptr<ParameterSpec> level = Parameter("level", PARAMETER_INT, "l", "A level: %ENUM%");
     boost::shared_ptr<ParameterConstraint> levels = ParameterConstraint::New(CONSTRAINT_INT_ENUM);
     for (long long value : {1, 2, 4}) levels->AddIntEnum(value);
     level->SetConstraint(levels);
-    spec->AddParameter(level);
+    inputSpec->AddParameter(level);
 
     boost::shared_ptr<ParameterSpec> mode = Parameter("mode", PARAMETER_STRING, "m", "The mode. Should be one in set %ENUM%.");
     boost::shared_ptr<ParameterConstraint> modes = ParameterConstraint::New(CONSTRAINT_STRING_ENUM);
     modes->AddStringEnum("transport", "");
     modes->AddStringEnum("tunnel", "");
     mode->SetConstraint(modes);
-    spec->AddParameter(mode);
+    inputSpec->AddParameter(mode);
 
     boost::shared_ptr<ParameterSpec> kind = Parameter("kind", PARAMETER_STRING, "k", "Address type : %FULLENUM%");
     boost::shared_ptr<ParameterConstraint> kinds = ParameterConstraint::New(3);
     kinds->AddStringEnum("static", "Set static IPv4 information.");
     kinds->AddStringEnum("dhcp", "Use DHCP.");
     kind->SetConstraint(kinds);
-    spec->AddParameter(kind);
+    inputSpec->AddParameter(kind);
 
     boost::shared_ptr<ParameterSpec> label = ParameterSpec::New("label", 0);
     label->SetDescription("A lower-case label that starts with a letter.");
     boost::shared_ptr<ParameterConstraint> pattern = ParameterConstraint::New(CONSTRAINT_STRING_REGEX);
     pattern->SetStringRegex("[a-z][a-z0-9]*");
     label->SetConstraint(pattern);
-    spec->AddParameter(label);
+    inputSpec->AddParameter(label);
 
-    spec->AddParameter(Parameter("enabled", PARAMETER_BOOL, "e", "Whether it is enabled."));
-    spec->AddParameter(Parameter("verbose", PARAMETER_FLAG, "v", "Say more."));
-    return spec;
+    inputSpec->AddParameter(Parameter("enabled", PARAMETER_BOOL, "e", "Whether it is enabled."));
+    inputSpec->AddParameter(Parameter("verbose", PARAMETER_FLAG, "v", "Say more."));
+    return inputSpec;
 }
 
 boost::shared_ptr<OutputSpec> Echo::GetOutputSpecInternal() {
-    boost::shared_ptr<OutputSpec> spec = OutputSpec::New();
-    spec->SetResultType(EchoStructure());
-    return spec;
+    boost::shared_ptr<OutputSpec> outputSpec = OutputSpec::New();
+    outputSpec->SetResultType(EchoStructure());
+    return outputSpec;
 }
 
 void Echo::ExecuteInternal(boost::shared_ptr<Input> input, boost::shared_ptr<Output> output) {

@@ -10,9 +10,9 @@ namespace Demo {
 namespace {
 
 boost::shared_ptr<OutputSpec> ResultType(boost::shared_ptr<MetaObject> shape) {
-    boost::shared_ptr<OutputSpec> spec = OutputSpec::New();
-    spec->SetResultType(shape);
-    return spec;
+    boost::shared_ptr<OutputSpec> outputSpec = OutputSpec::New();
+    outputSpec->SetResultType(shape);
+    return outputSpec;
 }
 
 boost::shared_ptr<ParameterSpec> Flag(char const* name, char const* help) {
@@ -71,9 +71,9 @@ boost::shared_ptr<MetaStruct> SwitchStructure() {
 Fail::Fail() { SetDescription("Report failures, with or without a result."); }
 
 boost::shared_ptr<InputSpec> Fail::GetInputSpecInternal() {
-    boost::shared_ptr<InputSpec> spec = InputSpec::New();
-    spec->AddParameter(Flag("with-result", "Deliver true as well."));
-    return spec;
+    boost::shared_ptr<InputSpec> inputSpec = InputSpec::New();
+    inputSpec->AddParameter(Flag("with-result", "Deliver true as well."));
+    return inputSpec;
 }
 
 boost::shared_ptr<OutputSpec> Fail::GetOutputSpecInternal() { return ResultType(MetaBool::New()); }
@@ -97,13 +97,13 @@ void Throw::ExecuteInternal(boost::shared_ptr<Input>, boost::shared_ptr<Output>)
 Bool::Bool() { SetDescription("Deliver a boolean."); }
 
 boost::shared_ptr<InputSpec> Bool::GetInputSpecInternal() {
-    boost::shared_ptr<InputSpec> spec = InputSpec::New();
+    boost::shared_ptr<InputSpec> inputSpec = InputSpec::New();
     boost::shared_ptr<ParameterSpec> value = ParameterSpec::New("value", PARAMETER_BOOL);
     value->SetShortName("b");
     value->SetDescription("The value to deliver.");
-    spec->AddParameter(value);
-    spec->AddParameter(Flag("unset", "Deliver a boolean without a value."));
-    return spec;
+    inputSpec->AddParameter(value);
+    inputSpec->AddParameter(Flag("unset", "Deliver a boolean without a value."));
+    return inputSpec;
 }
 
 boost::shared_ptr<OutputSpec> Bool::GetOutputSpecInternal() { return ResultType(MetaBool::New()); }
@@ -124,9 +124,9 @@ NicTable::NicTable() {
 }
 
 boost::shared_ptr<InputSpec> NicTable::GetInputSpecInternal() {
-    boost::shared_ptr<InputSpec> spec = InputSpec::New();
-    spec->AddParameter(Flag("empty", "List no NIC at all."));
-    return spec;
+    boost::shared_ptr<InputSpec> inputSpec = InputSpec::New();
+    inputSpec->AddParameter(Flag("empty", "List no NIC at all."));
+    return inputSpec;
 }
 
 boost::shared_ptr<OutputSpec> NicTable::GetOutputSpecInternal() {

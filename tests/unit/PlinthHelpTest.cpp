@@ -63,15 +63,15 @@ TEST(PlinthHelp, CommandHelpLayout) {
     boost::shared_ptr<ScriptedCommand> set = ScriptedCommand::New("Set firewall ruleset status.");
     root->SubNamespace("network")->SubNamespace("firewall")->RegisterNamespaceNode(set, "set");
     set->inputSpec = [] {
-        boost::shared_ptr<InputSpec> spec = InputSpec::New();
-        spec->AddParameter(MakeParameter("enabled", PARAMETER_BOOL, "e",
+        boost::shared_ptr<InputSpec> inputSpec = InputSpec::New();
+        inputSpec->AddParameter(MakeParameter("enabled", PARAMETER_BOOL, "e",
                                          "Set to true to enable ruleset, set to false to disable it. This text is "
                                          "long enough to wrap onto a second line."));
-        spec->AddParameter(MakeParameter("ruleset-id", PARAMETER_STRING, "r", "The label of the ruleset.", true));
-        spec->AddParameter(MakeParameter("override-vswitch-allow-promiscuous", PARAMETER_BOOL, "",
+        inputSpec->AddParameter(MakeParameter("ruleset-id", PARAMETER_STRING, "r", "The label of the ruleset.", true));
+        inputSpec->AddParameter(MakeParameter("override-vswitch-allow-promiscuous", PARAMETER_BOOL, "",
                                          "Too wide for the column."));
-        spec->AddParameter(MakeParameter("all", PARAMETER_FLAG, "a", ""));
-        return spec;
+        inputSpec->AddParameter(MakeParameter("all", PARAMETER_FLAG, "a", ""));
+        return inputSpec;
     };
     EXPECT_EQ((std::vector<std::string>{
                   "Usage: haldencli network firewall set [cmd options]",

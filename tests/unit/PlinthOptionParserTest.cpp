@@ -21,31 +21,31 @@ boost::shared_ptr<ParameterSpec> Constrained(std::string const& name, ParameterT
     return parameter;
 }
 
-boost::shared_ptr<InputSpec> Spec() {
-    boost::shared_ptr<InputSpec> spec = InputSpec::New();
-    spec->AddParameter(MakeParameter("name", PARAMETER_STRING, "n"));
-    spec->AddParameter(MakeParameter("count", PARAMETER_INT, "c"));
-    spec->AddParameter(MakeParameter("enabled", PARAMETER_BOOL, "e"));
-    spec->AddParameter(MakeParameter("verbose", PARAMETER_FLAG, "v"));
+boost::shared_ptr<InputSpec> OptionsSpec() {
+    boost::shared_ptr<InputSpec> inputSpec = InputSpec::New();
+    inputSpec->AddParameter(MakeParameter("name", PARAMETER_STRING, "n"));
+    inputSpec->AddParameter(MakeParameter("count", PARAMETER_INT, "c"));
+    inputSpec->AddParameter(MakeParameter("enabled", PARAMETER_BOOL, "e"));
+    inputSpec->AddParameter(MakeParameter("verbose", PARAMETER_FLAG, "v"));
 
     boost::shared_ptr<ParameterConstraint> range = ParameterConstraint::New(CONSTRAINT_INT_RANGE);
     range->SetIntRange(1, 4096);
-    spec->AddParameter(Constrained("ports", PARAMETER_INT, range));
+    inputSpec->AddParameter(Constrained("ports", PARAMETER_INT, range));
     boost::shared_ptr<ParameterConstraint> speeds = ParameterConstraint::New(CONSTRAINT_INT_ENUM);
     speeds->AddIntEnum(10);
     speeds->AddIntEnum(100);
-    spec->AddParameter(Constrained("speed", PARAMETER_INT, speeds));
+    inputSpec->AddParameter(Constrained("speed", PARAMETER_INT, speeds));
     boost::shared_ptr<ParameterConstraint> types = ParameterConstraint::New(CONSTRAINT_STRING_ENUM);
     types->AddStringEnum("static", "");
     types->AddStringEnum("dhcp", "");
-    spec->AddParameter(Constrained("type", PARAMETER_STRING, types));
+    inputSpec->AddParameter(Constrained("type", PARAMETER_STRING, types));
     boost::shared_ptr<ParameterConstraint> pattern = ParameterConstraint::New(CONSTRAINT_STRING_REGEX);
     pattern->SetStringRegex("tsl[0-9]+");
-    spec->AddParameter(Constrained("interface", PARAMETER_STRING, pattern));
-    return spec;
+    inputSpec->AddParameter(Constrained("interface", PARAMETER_STRING, pattern));
+    return inputSpec;
 }
 
-boost::shared_ptr<Input> Parse(std::vector<std::string> const& words) { return ParseCommandOptions(*Spec(), words); }
+boost::shared_ptr<Input> Parse(std::vector<std::string> const& words) { return ParseCommandOptions(*OptionsSpec(), words); }
 
 // The refusal text for words, or "" when they are accepted.
 std::string Refusal(std::vector<std::string> const& words) {
@@ -142,16 +142,16 @@ TEST(PlinthOptionParser, RefusesMalformedCommandLines) {
 }
 
 TEST(PlinthOptionParser, RequiredOptionsMustBeGiven) {
-    boost::shared_ptr<InputSpec> spec = InputSpec::New();
-    spec->AddParameter(MakeParameter("ruleset-id", PARAMETER_STRING, "r", "", true));
-    spec->AddParameter(MakeParameter("enabled", PARAMETER_BOOL, "e", "", true));
+    boost::shared_ptr<InputSpec> inputSpec = InputSpec::New();
+    inputSpec->AddParameter(MakeParameter("ruleset-id", PARAMETER_STRING, "r", "", true));
+    inputSpec->AddParameter(MakeParameter("enabled", PARAMETER_BOOL, "e", "", true));
     try {
-        ParseCommandOptions(*spec, {"-e", "true"});
+        ParseCommandOptions(*inputSpec, {"-e", "true"});
         FAIL() << "accepted without --ruleset-id";
     } catch (UsageError const& refusal) {
         EXPECT_STREQ("Missing required option --ruleset-id.", refusal.what());
     }
-    EXPECT_NO_THROW(ParseCommandOptions(*spec, {"-r", "dns", "-e", "0"}));
+    EXPECT_NO_THROW(ParseCommandOptions(*inputSpec, {"-r", "dns", "-e", "0"}));
     // A command without parameters takes an empty command line only.
     EXPECT_NO_THROW(ParseCommandOptions(*InputSpec::New(), {}));
     EXPECT_THROW(ParseCommandOptions(*InputSpec::New(), {"--any"}), UsageError);

@@ -23,9 +23,9 @@ public:
         return inputSpec ? inputSpec() : Plinth::CallSpec::InputSpec::New();
     }
     boost::shared_ptr<Plinth::CallSpec::OutputSpec> GetOutputSpecInternal() override {
-        boost::shared_ptr<Plinth::CallSpec::OutputSpec> spec = Plinth::CallSpec::OutputSpec::New();
-        if (shape) spec->SetResultType(shape());
-        return spec;
+        boost::shared_ptr<Plinth::CallSpec::OutputSpec> outputSpec = Plinth::CallSpec::OutputSpec::New();
+        if (shape) outputSpec->SetResultType(shape());
+        return outputSpec;
     }
     void ExecuteInternal(boost::shared_ptr<Plinth::CallSpec::Input> input,
                          boost::shared_ptr<Plinth::CallSpec::Output> output) override {

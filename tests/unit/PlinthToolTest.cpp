@@ -26,9 +26,9 @@ protected:
         ruleset->SetDescription("Ruleset commands");
         ruleset->RegisterNamespaceNode(command_, "get");
         command_->inputSpec = [] {
-            boost::shared_ptr<InputSpec> spec = InputSpec::New();
-            spec->AddParameter(MakeParameter("ruleset-id", PARAMETER_STRING, "r", "The label.", true));
-            return spec;
+            boost::shared_ptr<InputSpec> inputSpec = InputSpec::New();
+            inputSpec->AddParameter(MakeParameter("ruleset-id", PARAMETER_STRING, "r", "The label.", true));
+            return inputSpec;
         };
         command_->body = [](Input& input, Output& output) {
             boost::shared_ptr<MetaStruct> ruleset = MetaStruct::New("Ruleset");
@@ -151,9 +151,9 @@ TEST_F(PlinthTool, AnInputSpecThatNeedsTheHostGetsItForRunsAndForHelp) {
     bool hostOpen = false;
     command_->inputSpec = [&hostOpen] {
         if (!hostOpen) throw std::runtime_error("No host is open");
-        boost::shared_ptr<InputSpec> spec = InputSpec::New();
-        spec->AddParameter(MakeParameter("ccalgo", PARAMETER_STRING, "c", "From the host."));
-        return spec;
+        boost::shared_ptr<InputSpec> inputSpec = InputSpec::New();
+        inputSpec->AddParameter(MakeParameter("ccalgo", PARAMETER_STRING, "c", "From the host."));
+        return inputSpec;
     };
     auto openHost = [&hostOpen](std::string const&) { hostOpen = true; };
     std::ostringstream out, err;

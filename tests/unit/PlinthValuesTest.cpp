@@ -163,9 +163,9 @@ TEST(PlinthCommand, MetadataHintsAndTheLastFormatterStand) {
 TEST(PlinthCommand, ExecuteRunsTheCommandsOwnBodyAndSpecsAreFreshEachTime) {
     boost::shared_ptr<ScriptedCommand> command = ScriptedCommand::New();
     command->inputSpec = [] {
-        boost::shared_ptr<InputSpec> spec = InputSpec::New();
-        spec->AddParameter(ParameterSpec::New("name", PARAMETER_STRING));
-        return spec;
+        boost::shared_ptr<InputSpec> inputSpec = InputSpec::New();
+        inputSpec->AddParameter(ParameterSpec::New("name", PARAMETER_STRING));
+        return inputSpec;
     };
     command->body = [](Input& input, Output& output) {
         output.SetResult(MetaString::New(input.GetString("name")));
@@ -183,9 +183,9 @@ TEST(PlinthCommand, ExecuteRunsTheCommandsOwnBodyAndSpecsAreFreshEachTime) {
 TEST(PlinthCommand, GenerateHelpOutputDescribesTheOptions) {
     boost::shared_ptr<ScriptedCommand> command = ScriptedCommand::New("Show it.");
     command->inputSpec = [] {
-        boost::shared_ptr<InputSpec> spec = InputSpec::New();
-        spec->AddParameter(PlinthTest::MakeParameter("name", PARAMETER_STRING, "n", "The name.", true));
-        return spec;
+        boost::shared_ptr<InputSpec> inputSpec = InputSpec::New();
+        inputSpec->AddParameter(PlinthTest::MakeParameter("name", PARAMETER_STRING, "n", "The name.", true));
+        return inputSpec;
     };
     boost::shared_ptr<Output> output = Output::New();
     command->GenerateHelpOutput(Input::New(), output);

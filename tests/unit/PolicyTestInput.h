@@ -16,9 +16,9 @@
 using AddPolicyParameters = void (*)(boost::shared_ptr<Plinth::CallSpec::InputSpec>);
 
 inline boost::shared_ptr<Plinth::CallSpec::InputSpec> PolicySpec(AddPolicyParameters add) {
-    boost::shared_ptr<Plinth::CallSpec::InputSpec> spec = Plinth::CallSpec::InputSpec::New();
-    add(spec);
-    return spec;
+    boost::shared_ptr<Plinth::CallSpec::InputSpec> inputSpec = Plinth::CallSpec::InputSpec::New();
+    add(inputSpec);
+    return inputSpec;
 }
 
 // Throws Plinth::Cli::UsageError for words the tool would refuse.

@@ -102,8 +102,8 @@ TEST(VirtualSwitchPortGroup, RefusalsNameTheirObjectAndChangeNothing) {
 }
 
 TEST(VirtualSwitchPortGroupSet, TheVlanHelpShowsTheHostsRange) {
-    boost::shared_ptr<Plinth::CallSpec::InputSpec> spec = VirtualSwitchPortGroupSet::New()->GetInputSpec();
-    boost::shared_ptr<Plinth::CallSpec::ParameterSpec> vlanId = spec->GetParameters().at(1);
+    boost::shared_ptr<Plinth::CallSpec::InputSpec> inputSpec = VirtualSwitchPortGroupSet::New()->GetInputSpec();
+    boost::shared_ptr<Plinth::CallSpec::ParameterSpec> vlanId = inputSpec->GetParameters().at(1);
     EXPECT_EQ(vlanId->GetName(), "vlan-id");
     EXPECT_EQ(vlanId->GetDescription(), "The vlan id for this port group. This value is in the range (0 - 4095)");
 }

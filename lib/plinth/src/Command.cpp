@@ -14,13 +14,13 @@ using CallSpec::OutputSpec;
 Command::~Command() = default;
 
 boost::shared_ptr<InputSpec> Command::GetInputSpec() {
-    boost::shared_ptr<InputSpec> spec = GetInputSpecInternal();
-    return spec ? spec : InputSpec::New();
+    boost::shared_ptr<InputSpec> inputSpec = GetInputSpecInternal();
+    return inputSpec ? inputSpec : InputSpec::New();
 }
 
 boost::shared_ptr<OutputSpec> Command::GetOutputSpec() {
-    boost::shared_ptr<OutputSpec> spec = GetOutputSpecInternal();
-    return spec ? spec : OutputSpec::New();
+    boost::shared_ptr<OutputSpec> outputSpec = GetOutputSpecInternal();
+    return outputSpec ? outputSpec : OutputSpec::New();
 }
 
 void Command::Execute(boost::shared_ptr<Input> input, boost::shared_ptr<Output> output) {
@@ -73,8 +73,8 @@ void Command::AddExample(std::string const& description, std::string const& exam
 void Command::GenerateHelpOutput(boost::shared_ptr<Input>, boost::shared_ptr<Output> output) {
     using namespace MetaObj;
     boost::shared_ptr<MetaList> options = MetaList::New(META_STRUCT, MetaStruct::New("CommandOption"));
-    boost::shared_ptr<InputSpec> const spec = GetInputSpec();
-    for (auto const& parameter : spec->GetParameters()) {
+    boost::shared_ptr<InputSpec> const inputSpec = GetInputSpec();
+    for (auto const& parameter : inputSpec->GetParameters()) {
         boost::shared_ptr<MetaStruct> option = MetaStruct::New("CommandOption");
         option->SetField("Name", parameter->GetName());
         option->SetField("Short Name", parameter->GetShortName());

@@ -98,8 +98,8 @@ std::string HelpWriter::CommandHelp(AutoCli::Command& command) const {
     std::string text = "Usage: " + programName_ + " " + command.GetPathString(' ') + " [cmd options]\n";
     text += "\nDescription:\n" + Paragraph(command.GetDescription(), 2);
     text += "\nCmd options:\n";
-    boost::shared_ptr<CallSpec::InputSpec> const spec = command.GetInputSpec();
-    for (auto const& parameter : spec->GetParameters()) {
+    boost::shared_ptr<CallSpec::InputSpec> const inputSpec = command.GetInputSpec();
+    for (auto const& parameter : inputSpec->GetParameters()) {
         text += FormatColumns(OptionSignature(*parameter), OptionText(*parameter), 2, kOptionColumn, kWidth);
     }
     std::vector<AutoCli::Command::Example> const examples = command.GetExamples();

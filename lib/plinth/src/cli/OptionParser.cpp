@@ -92,14 +92,14 @@ void StoreValue(ParameterSpec const& parameter, std::string const& text, Input& 
 
 }  // namespace
 
-boost::shared_ptr<Input> ParseCommandOptions(InputSpec const& spec, std::vector<std::string> const& words) {
+boost::shared_ptr<Input> ParseCommandOptions(InputSpec const& inputSpec, std::vector<std::string> const& words) {
     boost::shared_ptr<Input> input = Input::New();
     std::set<std::string> given;
     for (size_t i = 0; i < words.size(); ++i) {
         if (!IsOptionWord(words[i])) Refuse("Unexpected argument '" + words[i] + "'.");
         OptionWord option = SplitOption(words[i]);
         boost::shared_ptr<ParameterSpec> const parameter =
-            option.isShort ? spec.FindByShortName(option.name) : spec.FindByName(option.name);
+            option.isShort ? inputSpec.FindByShortName(option.name) : inputSpec.FindByName(option.name);
         if (!parameter) Refuse("Unknown option " + option.typed + ".");
 
         std::string const longOption = "--" + parameter->GetName();
@@ -119,7 +119,7 @@ boost::shared_ptr<Input> ParseCommandOptions(InputSpec const& spec, std::vector<
         }
         StoreValue(*parameter, option.value, *input);
     }
-    for (auto const& parameter : spec.GetParameters()) {
+    for (auto const& parameter : inputSpec.GetParameters()) {
         if (parameter->IsRequired() && !given.count(parameter->GetName())) {
             Refuse("Missing required option --" + parameter->GetName() + ".");
         }

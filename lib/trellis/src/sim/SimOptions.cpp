@@ -28,17 +28,17 @@ ParsedOptions ParseOptions(const std::vector<std::string>& args, std::size_t fir
             value = name.substr(equals + 1);
             name.erase(equals);
         }
-        const OptionSpec* spec = nullptr;
+        const OptionSpec* option = nullptr;
         static const OptionSpec kHelp{"help", false};
-        if (name == "help") spec = &kHelp;
+        if (name == "help") option = &kHelp;
         for (const OptionSpec& candidate : specs)
-            if (candidate.name == name) spec = &candidate;
-        if (!spec) throw UsageError("unknown option --" + name);
+            if (candidate.name == name) option = &candidate;
+        if (!option) throw UsageError("unknown option --" + name);
         if (parsed.Has(name)) throw UsageError("--" + name + " is given twice");
-        if (spec->takesValue && !value) {
+        if (option->takesValue && !value) {
             if (i + 1 >= args.size()) throw UsageError("--" + name + " needs a value");
             value = args[++i];
-        } else if (!spec->takesValue && value) {
+        } else if (!option->takesValue && value) {
             throw UsageError("--" + name + " takes no value");
         }
         parsed.values_[name] = value.value_or("");

@@ -19,7 +19,7 @@ namespace Cli {
 // A word after an option that starts with '-' is taken as its value only when
 // it is a negative number; a string value that starts with '-' is given as
 // --name=-value. Throws UsageError with the first problem found.
-boost::shared_ptr<CallSpec::Input> ParseCommandOptions(CallSpec::InputSpec const& spec,
+boost::shared_ptr<CallSpec::Input> ParseCommandOptions(CallSpec::InputSpec const& inputSpec,
                                                        std::vector<std::string> const& words);
 
 }  // namespace Cli
