@@ -32,9 +32,6 @@ expect_stderr "Default action already PASS"
 expect_stdout_empty
 cli --formatter=json network firewall get
 expect_stdout '{"Loaded":true,"Enabled":true,"DefaultAction":"PASS"}'
-cli network firewall set
-expect_status 1
-expect_stderr "Need parameter --enabled or --default-action"
 
 check "ruleset list shows a table of every ruleset"
 cli network firewall ruleset list

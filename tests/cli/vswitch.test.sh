@@ -58,12 +58,9 @@ expect_status 0
 expect_stdout '[{"Name":"switch1","Class":"etherswitch","Num Ports":128,"Used Ports":1,"Configured Ports":128,"MTU":1500,"CDP Status":"listen","Beacon Enabled":false,"Beacon Interval":1,"Beacon Threshold":3,"Beacon Required By":[],"Uplinks":["pnet1"],"Portgroups":["Storage"]}]'
 cli --formatter json network vswitch standard list -v switch2
 expect_stdout_contains '"Num Ports":384,"Used Ports":0'
+expect_stdout_contains '"Beacon Required By":[],"Uplinks":[],"Portgroups":[]'
 cli --formatter json network vswitch standard portgroup list
 expect_stdout '[{"Name":"Host Management","Virtual Switch":"switch0","Active Clients":1,"VLAN ID":0},{"Name":"Guest Network","Virtual Switch":"switch0","Active Clients":1,"VLAN ID":0},{"Name":"Storage","Virtual Switch":"switch1","Active Clients":0,"VLAN ID":20}]'
-
-check "a switch without uplinks lists empty lists"
-cli --formatter json network vswitch standard list -v switch2
-expect_stdout_contains '"Beacon Required By":[],"Uplinks":[],"Portgroups":[]'
 
 check "MTU and CDP status are set, and set with no option changes nothing"
 cli network vswitch standard set -v switch1 -m 9000 -c both
@@ -125,8 +122,6 @@ expect_status 2
 expect_stderr_first_line "Error: Invalid value for option --vlan-id: 4096 is not in the range 0 to 4095."
 cli network vswitch standard set -v switch1 -c up
 expect_status 2
-cli network vswitch standard portgroup set --help
-expect_stdout_contains "The vlan id for this port group. This value is in the"
 
 check "an armed fault reaches the command's handler"
 sim fault add --operation "VirtualSwitch::AddPortGroup" --message "port group table full" --times 1

@@ -26,9 +26,9 @@ using Plinth::CallSpec::OutputSpec;
 DEMO_COMMAND(Echo);
 // demo fail: error texts, with or without a result.
 DEMO_COMMAND(Fail);
-// demo throw: an exception out of ExecuteInternal.
+// demo throw: an exception out of ExecuteInternal, after an error text.
 DEMO_COMMAND(Throw);
-// demo bool: a boolean result, set or unset.
+// demo bool: a boolean result.
 DEMO_COMMAND(Bool);
 // demo nic list: a table of structures with fields, header and unit hints.
 DEMO_COMMAND(NicTable);

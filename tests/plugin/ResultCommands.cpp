@@ -90,7 +90,8 @@ void Fail::ExecuteInternal(boost::shared_ptr<Input> input, boost::shared_ptr<Out
 Throw::Throw() { SetDescription("Fail with an exception."); }
 boost::shared_ptr<InputSpec> Throw::GetInputSpecInternal() { return InputSpec::New(); }
 boost::shared_ptr<OutputSpec> Throw::GetOutputSpecInternal() { return ResultType(MetaBool::New()); }
-void Throw::ExecuteInternal(boost::shared_ptr<Input>, boost::shared_ptr<Output>) {
+void Throw::ExecuteInternal(boost::shared_ptr<Input>, boost::shared_ptr<Output> output) {
+    output->SetError("Before the throw.");
     throw std::runtime_error("The host did not answer.");
 }
 
@@ -102,14 +103,13 @@ boost::shared_ptr<InputSpec> Bool::GetInputSpecInternal() {
     value->SetShortName("b");
     value->SetDescription("The value to deliver.");
     inputSpec->AddParameter(value);
-    inputSpec->AddParameter(Flag("unset", "Deliver a boolean without a value."));
     return inputSpec;
 }
 
 boost::shared_ptr<OutputSpec> Bool::GetOutputSpecInternal() { return ResultType(MetaBool::New()); }
 
 void Bool::ExecuteInternal(boost::shared_ptr<Input> input, boost::shared_ptr<Output> output) {
-    output->SetResult(input->GetFlag("unset") ? MetaBool::New() : MetaBool::New(input->GetBool("value")));
+    output->SetResult(MetaBool::New(input->GetBool("value")));
     output->Finish();
 }
 

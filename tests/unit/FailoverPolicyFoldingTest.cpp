@@ -69,6 +69,7 @@ TEST_F(FailoverFolding, SingleSettingsSetTheirValueAndBit) {
     EXPECT_EQ(Gantry::Network::TeamPolicyType::IpHash, Fold({"-l", "iphash"}).policy.teamPolicy);
     EXPECT_EQ(Gantry::Network::TeamPolicyType::SourceMac, Fold({"-l", "mac"}).policy.teamPolicy);
     EXPECT_EQ(Gantry::Network::TeamPolicyType::ExplicitOrder, Fold({"-l", "explicit"}).policy.teamPolicy);
+    EXPECT_EQ(NicTeamingPolicy::MASK_TEAM_POLICY, Fold({"-l", "mac"}).policy.setMask);
 
     // "link" goes to SetBeacon(true), "beacon" to SetBeacon(false).
     Folded link = Fold({"--failure-detection=link"});

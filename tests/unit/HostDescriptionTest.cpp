@@ -1,4 +1,6 @@
-// Host descriptions: the round trip, the refusal of bad ones, replacement.
+// Host descriptions: the round trip, the refusal of bad ones (a representative
+// set; a missing field and a port out of range are refused through haldensim
+// in tests/cli/haldensim.test.sh), replacement.
 
 #include <gtest/gtest.h>
 
@@ -66,37 +68,29 @@ TEST(HostDescription, BadDescriptionsAreRefusedWithTheirPathAndChangeNothing) {
     };
     const std::vector<Case> cases = {
         {[](Json& d) { d["format"] = 2; }, "format: expected 1, the format this version reads"},
-        {[](Json& d) { d.erase("format"); }, "format: missing required field"},
         {[](Json& d) { d["switchez"] = Json::array(); }, "switchez: unknown field"},
         {[](Json& d) { d["modules"] = Json::object(); }, "modules: expected an array"},
         {[](Json& d) { d["modules"][0]["loaded"] = "yes"; }, "modules[0].loaded: expected true or false"},
         {[](Json& d) { d["modules"].push_back(d["modules"][0]); }, "modules[1].name: duplicate module \"haldenfw\""},
-        {[](Json& d) { d["firewall"].erase("enabled"); }, "firewall.enabled: missing required field"},
         {[](Json& d) { d["firewall"]["defaultAction"] = "drop"; },
          "firewall.defaultAction: expected \"DROP\" or \"PASS\""},
-        {[](Json& d) { d["firewall"]["rulesets"][2]["rules"][0]["portBegin"] = 65536; },
-         "firewall.rulesets[2].rules[0].portBegin: expected an integer from 0 to 65535"},
         {[](Json& d) { d["firewall"]["rulesets"][2]["rules"][0]["portBegin"] = 67.0; },
          "firewall.rulesets[2].rules[0].portBegin: expected an integer from 0 to 65535"},
         {[](Json& d) { d["firewall"]["rulesets"][2]["rules"][1]["portEnd"] = 66; },
          "firewall.rulesets[2].rules[1].portEnd: expected a port not below portBegin (67)"},
-        {[](Json& d) { d["firewall"]["rulesets"][0]["rules"][0]["direction"] = "in"; },
-         "firewall.rulesets[0].rules[0].direction: expected \"inbound\" or \"outbound\""},
         {[](Json& d) { d["firewall"]["rulesets"][0]["rules"][0]["protocol"] = "TCP"; },
          "firewall.rulesets[0].rules[0].protocol: expected \"tcp\" or \"udp\""},
         {[](Json& d) { d["firewall"]["rulesets"][0]["rules"][0]["colour"] = "red"; },
          "firewall.rulesets[0].rules[0].colour: unknown field"},
-        {[](Json& d) { d["firewall"]["rulesets"][3]["name"] = "dhcp"; },
-         "firewall.rulesets[3].name: duplicate ruleset \"dhcp\""},
         {[](Json& d) { d["firewall"]["rulesets"][5]["allowedIps"]["ipv4Addresses"][0] = "192.0.2.010"; },
          "firewall.rulesets[5].allowedIps.ipv4Addresses[0]: expected an IPv4 address in canonical form, such as "
          "\"192.0.2.1\""},
+        {[](Json& d) { d["firewall"]["rulesets"][5]["allowedIps"]["ipv6Addresses"][0] = "192.0.2.1"; },
+         "firewall.rulesets[5].allowedIps.ipv6Addresses[0]: expected an IPv6 address in canonical form, such as "
+         "\"2001:db8::1\""},
         {[](Json& d) { d["firewall"]["rulesets"][5]["allowedIps"]["ipv6Networks"][0] = "2001:DB8:100::/48"; },
          "firewall.rulesets[5].allowedIps.ipv6Networks[0]: expected an IPv6 network in canonical form, such as "
          "\"2001:db8::/32\""},
-        {[](Json& d) { d["firewall"]["rulesets"][5]["allowedIps"]["ipv4Networks"][0] = "198.51.100.0/33"; },
-         "firewall.rulesets[5].allowedIps.ipv4Networks[0]: expected an IPv4 network in canonical form, such as "
-         "\"192.0.2.0/24\""},
         {[](Json& d) { d["firewall"]["rulesets"][5]["allowedIps"]["ipv4Addresses"][1] = "192.0.2.10"; },
          "firewall.rulesets[5].allowedIps.ipv4Addresses[1]: duplicate entry \"192.0.2.10\""},
         {[](Json& d) { d["faults"] = Json::array({Json{{"operation", "Nope::Nope"}, {"message", "x"}}}); },

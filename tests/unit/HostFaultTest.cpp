@@ -17,21 +17,15 @@
 using namespace Trellis::Host;
 using Trellis::Util::Trellis_Exec;
 
-TEST(HostFaults, BadFaultsAreRefused) {
+// The other refusals are proven through haldensim in tests/cli/haldensim.test.sh.
+TEST(HostFaults, ABadFaultIsRefusedAndNothingIsArmed) {
     TempHost host;
-    auto refused = [](Fault fault) {
-        try {
-            ArmFault(fault);
-        } catch (const std::invalid_argument& e) {
-            return std::string(e.what());
-        }
-        return std::string();
-    };
-    EXPECT_EQ(refused({"HostTest::Incremant", "busy", 0, {}}), "Unknown operation \"HostTest::Incremant\"");
-    EXPECT_EQ(refused({"Trellis_Exec", "busy", 0, {}}), "Trellis_Exec takes a status, not a message");
-    EXPECT_EQ(refused({"Trellis_Exec", "", 0, {}}), "Trellis_Exec takes a status other than 0");
-    EXPECT_EQ(refused({"HostTest::Increment", "", 3, {}}), "HostTest::Increment takes a message, not a status");
-    EXPECT_EQ(refused({"HostTest::Increment", "busy", 0, 0}), "The number of calls must be at least 1");
+    try {
+        ArmFault({"HostTest::Increment", "", 3, {}});
+        ADD_FAILURE() << "armed";
+    } catch (const std::invalid_argument& e) {
+        EXPECT_STREQ(e.what(), "HostTest::Increment takes a message, not a status");
+    }
     EXPECT_TRUE(ListFaults().empty());
 }
 

@@ -1,12 +1,13 @@
-// The host store: creation, refusal of files that are not host stores,
-// migration, concurrent processes, a writer killed mid-transaction.
+// The host store: refusal of files that are not host stores, migration,
+// concurrent writers, a writer killed mid-transaction. First use, alone and
+// concurrent, and a text file for a host are proven through haldensim in
+// tests/cli/haldensim.test.sh.
 
 #include <signal.h>
 #include <sqlite3.h>
 #include <sys/wait.h>
 #include <unistd.h>
 
-#include <filesystem>
 #include <fstream>
 #include <iterator>
 
@@ -22,7 +23,6 @@
 #include "trellis/host/records/ModuleRecord.h"
 
 using namespace Trellis::Host;
-namespace fs = std::filesystem;
 
 namespace {
 
@@ -47,35 +47,9 @@ void RunSql(const std::string& path, const std::string& sql) {
     ASSERT_EQ(rc, SQLITE_OK) << message;
 }
 
-std::vector<std::string> FilesIn(const std::string& dir) {
-    std::vector<std::string> names;
-    for (const auto& entry : fs::directory_iterator(dir)) names.push_back(entry.path().filename().string());
-    std::sort(names.begin(), names.end());
-    return names;
-}
-
 const Operation kPutMany("HostTest::PutMany");
 
-// The labels of the default host's rulesets, in their order.
-std::vector<std::string> DefaultRulesetNames() {
-    const TempHost::Json host = TempHost::Json::parse(Trellis::Host::kDefaultHostDescription);
-    std::vector<std::string> names;
-    for (const auto& ruleset : host["firewall"]["rulesets"]) names.push_back(ruleset["name"]);
-    return names;
-}
-
 }  // namespace
-
-TEST(HostStore, FirstUseCreatesDirectoriesAndTheDefaultHost) {
-    TempHost scratch;
-    std::string path = scratch.Dir() + "/state/halden/host.db";
-    OpenHost(path);
-    EXPECT_TRUE(fs::is_regular_file(path));
-    EXPECT_EQ(ExportHost(), kDefaultHostDescription);
-    CloseHost();
-    // Nothing of the creation is left beside it.
-    EXPECT_EQ(FilesIn(scratch.Dir() + "/state/halden"), std::vector<std::string>{"host.db"});
-}
 
 TEST(HostStore, RefusesFilesThatAreNotHostStoresAndLeavesThemUntouched) {
     TempHost scratch;
@@ -89,7 +63,6 @@ TEST(HostStore, RefusesFilesThatAreNotHostStoresAndLeavesThemUntouched) {
         const char* problem;
     };
     std::vector<Case> cases = {
-        {"text", [](const std::string& p) { WriteBytes(p, std::string(3000, 'x') + "\n"); }, "not a host store"},
         {"empty", [](const std::string& p) { WriteBytes(p, ""); }, "not a host store"},
         {"foreign", [](const std::string& p) { RunSql(p, "CREATE TABLE notes (text TEXT); INSERT INTO notes VALUES ('hi')"); },
          "not a host store"},
@@ -163,20 +136,6 @@ TEST(HostStore, MigratesAnOlderStoreInOneStep) {
     const Operation count("HostTest::CountRulesets");
     EXPECT_EQ(count.Read([](Transaction& t) { return t.Count<FirewallRulesetRecord>(); }),
               DefaultRulesetNames().size());
-}
-
-TEST(HostStore, ConcurrentFirstUseCreatesOneCompleteHost) {
-    TempHost scratch;
-    CloseHost();
-    std::string path = scratch.Dir() + "/new/host.db";
-    std::vector<int> statuses = RunInChildren(4, [&](int) {
-        OpenHost(path);
-        return ExportHost() == kDefaultHostDescription ? 0 : 1;
-    });
-    EXPECT_EQ(statuses, std::vector<int>(4, 0));
-    // The children left without closing, so the host's -wal and -shm may stay;
-    // none of the hosts they built is left over.
-    for (const std::string& name : FilesIn(scratch.Dir() + "/new")) EXPECT_EQ(name.find(".new-"), std::string::npos) << name;
 }
 
 TEST(HostStore, ConcurrentWritersLoseNoUpdate) {

@@ -1,12 +1,14 @@
 #pragma once
 
 // A record kind and operations that exist only in the unit tests, to drive
-// the store without depending on any facade.
+// the store without depending on any facade; and what the default host holds.
 
 #include <string>
+#include <vector>
 
 #include <nlohmann/json.hpp>
 
+#include "trellis/host/Description.h"
 #include "trellis/host/JsonReader.h"
 #include "trellis/host/Operation.h"
 
@@ -40,4 +42,12 @@ inline int CounterValue(const std::string& name) {
     return kReadCounter.Read([&](Trellis::Host::Transaction& t) {
         return t.Find<CounterRecord>(name).value_or(CounterRecord{name, 0}).value;
     });
+}
+
+// The labels of the default host's rulesets, in their order.
+inline std::vector<std::string> DefaultRulesetNames() {
+    const nlohmann::json host = nlohmann::json::parse(Trellis::Host::kDefaultHostDescription);
+    std::vector<std::string> names;
+    for (const auto& ruleset : host["firewall"]["rulesets"]) names.push_back(ruleset["name"]);
+    return names;
 }

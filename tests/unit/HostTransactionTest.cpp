@@ -6,7 +6,6 @@
 
 #include "HostTestRecords.h"
 #include "TempHost.h"
-#include "trellis/host/Description.h"
 #include "trellis/host/records/FirewallRecords.h"
 
 using namespace Trellis::Host;
@@ -23,14 +22,6 @@ std::vector<std::string> CounterNames() {
 struct Unrelated {
     int code;
 };
-
-// The labels of the default host's rulesets, in their order.
-std::vector<std::string> DefaultRulesetNames() {
-    const TempHost::Json host = TempHost::Json::parse(Trellis::Host::kDefaultHostDescription);
-    std::vector<std::string> names;
-    for (const auto& ruleset : host["firewall"]["rulesets"]) names.push_back(ruleset["name"]);
-    return names;
-}
 
 }  // namespace
 

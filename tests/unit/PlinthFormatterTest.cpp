@@ -1,6 +1,8 @@
 // The formatters on the shapes commands deliver: a structure, a list of
 // structures, nested lists and structures, unset fields, booleans; and the
-// hints that choose fields, titles and units.
+// hints that choose fields, titles and units. The simple layout of nested
+// structures and an empty table with its shape are proven through the test
+// plug-in in tests/cli/frame.test.sh.
 #include <gtest/gtest.h>
 
 #include <sstream>
@@ -120,25 +122,6 @@ TEST(PlinthSimpleFormatter, ListOfStructuresAsBlocksWithFieldAndHeaderHints) {
               Render("simple", Rulesets(), {{"fields:Ruleset", "Name"}, {"header:Ruleset", "<NONE>"}}));
 }
 
-TEST(PlinthSimpleFormatter, NestedStructuresAndListsIndentFurtherAndUnitsFollowValues) {
-    EXPECT_EQ("switch0\n"
-              "   Name: switch0\n"
-              "   Policy:\n"
-              "         Enabled: true\n"
-              "         Average Bandwidth: 100 Kbps\n"
-              "   Portgroups:\n"
-              "      PortGroup\n"
-              "         Name: Host Management\n"
-              "\n"
-              "      PortGroup\n"
-              "         Name: Guest Network\n"
-              "   Uplinks: pnet0, pnet1\n",
-              Render("simple", Switch(),
-                     {{"header:VirtualSwitch", "%Name%"},
-                      {"header:ShapingPolicy", "<NONE>"},
-                      {"units:ShapingPolicy.Average Bandwidth", "Kbps"}}));
-}
-
 TEST(PlinthSimpleFormatter, BooleanResultPrintsOnlyFalse) {
     EXPECT_EQ("", Render("simple", MetaBool::New(true)));
     EXPECT_EQ("false\n", Render("simple", MetaBool::New(false)));
@@ -174,10 +157,7 @@ TEST(PlinthTableFormatter, ColumnHintsUnitsAndNestedCells) {
                       {"units:ShapingPolicy.Average Bandwidth", "Kbps"}}));
 }
 
-TEST(PlinthTableFormatter, EmptyListShowsTheHeaderOfTheShape) {
-    EXPECT_EQ("Name  Enabled\n----  -------\n",
-              Render("table", MetaList::New(3, RulesetShape()), {{"fields:Ruleset", "Name,Enabled"}}));
-    // Without a shape in the list, the command's output specification gives it.
+TEST(PlinthTableFormatter, AnEmptyListWithoutAShapeTakesTheOutputSpecifications) {
     boost::shared_ptr<MetaList> bare = MetaList::New(META_STRUCT);
     EXPECT_EQ("Name  Enabled\n----  -------\n",
               Render("table", bare, {{"fields:Ruleset", "Name,Enabled"}}, MetaList::New(3, RulesetShape())));
@@ -234,9 +214,4 @@ TEST(PlinthKeyValueFormatter, OneTypedLinePerValue) {
               "Ruleset.Timeout.integer=\n",
               Render("keyvalue", Ruleset("dns", true, {"53"})));
     EXPECT_EQ("boolean=false\n", Render("keyvalue", MetaBool::New(false)));
-}
-
-TEST(PlinthFormatters, UnknownNameHasNoFormatter) {
-    EXPECT_FALSE(Plinth::Cli::MakeFormatter("yaml"));
-    for (std::string const& name : Plinth::Cli::FormatterNames()) EXPECT_TRUE(Plinth::Cli::MakeFormatter(name)) << name;
 }

@@ -1,4 +1,5 @@
-// Help texts: namespace listings, command options, enum markers, wrapping.
+// Help texts: command options, enum markers, wrapping. Namespace listings are
+// proven through the test plug-in in tests/cli/frame.test.sh.
 #include <gtest/gtest.h>
 
 #include <sstream>
@@ -33,13 +34,6 @@ boost::shared_ptr<ParameterSpec> WithEnum(std::string const& help) {
 }
 
 }  // namespace
-
-TEST(PlinthHelp, OptionSignaturesByType) {
-    EXPECT_EQ("-r|--ruleset-id=<str>", HelpWriter::OptionSignature(*MakeParameter("ruleset-id", PARAMETER_STRING, "r")));
-    EXPECT_EQ("-p|--ports=<long>", HelpWriter::OptionSignature(*MakeParameter("ports", PARAMETER_INT, "p")));
-    EXPECT_EQ("--enabled=<bool>", HelpWriter::OptionSignature(*MakeParameter("enabled", PARAMETER_BOOL)));
-    EXPECT_EQ("-a|--all", HelpWriter::OptionSignature(*MakeParameter("all", PARAMETER_FLAG, "a")));
-}
 
 TEST(PlinthHelp, EnumMarkersExpandFromTheConstraint) {
     EXPECT_EQ("IP version : [static, dhcp, none] (required)",
@@ -90,33 +84,6 @@ TEST(PlinthHelp, CommandHelpLayout) {
               Lines(HelpWriter("haldencli").CommandHelp(*set)));
 }
 
-TEST(PlinthHelp, NamespaceHelpListsNamespacesThenCommandsInRegistrationOrder) {
-    boost::shared_ptr<Namespace> root = Namespace::New();
-    boost::shared_ptr<NamespaceNode> firewall = root->SubNamespace("network")->SubNamespace("firewall");
-    firewall->SetDescription("A set of commands for firewall related operations");
-    firewall->RegisterNamespaceNode(ScriptedCommand::New("Get the firewall status."), "get");
-    firewall->SubNamespace("ruleset")->SetDescription("Commands to list and update firewall ruleset configuration");
-    firewall->RegisterNamespaceNode(ScriptedCommand::New("Set the firewall."), "set");
-
-    EXPECT_EQ((std::vector<std::string>{
-                  "Usage: haldencli [options] {namespace}+ {cmd} [cmd options]",
-                  "",
-                  "A set of commands for firewall related operations",
-                  "",
-                  "Available Namespaces:",
-                  "  ruleset  Commands to list and update firewall ruleset configuration",
-                  "",
-                  "Available Commands:",
-                  "  get  Get the firewall status.",
-                  "  set  Set the firewall.",
-              }),
-              Lines(HelpWriter("haldencli").NamespaceHelp(*firewall)));
-
-    std::string const rootHelp = HelpWriter("haldencli").NamespaceHelp(*root);
-    EXPECT_NE(std::string::npos, rootHelp.find("\nOptions:\n  --formatter=<str>"));
-    EXPECT_NE(std::string::npos, rootHelp.find("\nAvailable Namespaces:\n  network\n"));
-}
-
 TEST(PlinthTextLayout, WrapsAtBlanksAndKeepsLongWordsWhole) {
     EXPECT_EQ((std::vector<std::string>{"one two", "three"}), Plinth::Cli::WrapText("one two three", 8));
     EXPECT_EQ((std::vector<std::string>{"a", "averyveryverylongword", "b"}),
@@ -126,9 +93,7 @@ TEST(PlinthTextLayout, WrapsAtBlanksAndKeepsLongWordsWhole) {
              "--x", std::string(300, 'w') + " " + std::string(30, 'y') + " z", 2, 24, 80))) {
         EXPECT_TRUE(line.size() <= 80 || line.find(' ', 24) == std::string::npos) << line;
     }
-}
-
-TEST(PlinthTextLayout, KeepsTheBlanksOfTheHelpTextWithinALine) {
+    // The blanks of the help text stay within a line.
     EXPECT_EQ((std::vector<std::string>{"listed  by name"}), Plinth::Cli::WrapText("listed  by name", 40));
     EXPECT_EQ((std::vector<std::string>{"listed", "by name"}), Plinth::Cli::WrapText("listed  by name", 8));
 }

@@ -59,19 +59,12 @@ std::string Refusal(std::vector<std::string> const& words) {
 
 }  // namespace
 
-TEST(PlinthOptionParser, LongShortAndInlineFormsAllReachTheInput) {
-    boost::shared_ptr<Input> input =
-        Parse({"--name", "pnet0", "-c", "-5", "--enabled=YES", "-v", "--type=dhcp", "--interface", "tsl12"});
-    EXPECT_EQ("pnet0", input->GetString("name"));
-    EXPECT_EQ(-5, input->GetInt("count"));
-    EXPECT_TRUE(input->GetBool("enabled"));
-    EXPECT_TRUE(input->GetFlag("verbose"));
-    EXPECT_EQ("dhcp", input->GetString("type"));
-    EXPECT_EQ("tsl12", input->GetString("interface"));
-    EXPECT_FALSE(input->HasParameter("ports"));
-
+// Every form reaching the command is proven through the binary (tests/cli/frame.test.sh).
+TEST(PlinthOptionParser, ValuesThatLookLikeOptionsOrHoldAnEqualsSign) {
+    // A separate value may start with '-' where it is a number.
+    EXPECT_EQ(-5, Parse({"-c", "-5"})->GetInt("count"));
     // A value may contain '=' and may start with '-' in the inline form.
-    input = Parse({"-n=a=b", "--count=+7"});
+    boost::shared_ptr<Input> input = Parse({"-n=a=b", "--count=+7"});
     EXPECT_EQ("a=b", input->GetString("name"));
     EXPECT_EQ(7, input->GetInt("count"));
     EXPECT_EQ("-x", Parse({"--name=-x"})->GetString("name"));
@@ -142,15 +135,11 @@ TEST(PlinthOptionParser, RefusesMalformedCommandLines) {
 }
 
 TEST(PlinthOptionParser, RequiredOptionsMustBeGiven) {
+    // Its text is checked where the tool prints it (PlinthToolTest).
     boost::shared_ptr<InputSpec> inputSpec = InputSpec::New();
     inputSpec->AddParameter(MakeParameter("ruleset-id", PARAMETER_STRING, "r", "", true));
     inputSpec->AddParameter(MakeParameter("enabled", PARAMETER_BOOL, "e", "", true));
-    try {
-        ParseCommandOptions(*inputSpec, {"-e", "true"});
-        FAIL() << "accepted without --ruleset-id";
-    } catch (UsageError const& refusal) {
-        EXPECT_STREQ("Missing required option --ruleset-id.", refusal.what());
-    }
+    EXPECT_THROW(ParseCommandOptions(*inputSpec, {"-e", "true"}), UsageError);
     EXPECT_NO_THROW(ParseCommandOptions(*inputSpec, {"-r", "dns", "-e", "0"}));
     // A command without parameters takes an empty command line only.
     EXPECT_NO_THROW(ParseCommandOptions(*InputSpec::New(), {}));

@@ -19,7 +19,6 @@ public:
     }
 
     boost::shared_ptr<Plinth::CallSpec::InputSpec> GetInputSpecInternal() override {
-        ++inputSpecRequests;
         return inputSpec ? inputSpec() : Plinth::CallSpec::InputSpec::New();
     }
     boost::shared_ptr<Plinth::CallSpec::OutputSpec> GetOutputSpecInternal() override {
@@ -37,7 +36,6 @@ public:
     std::function<boost::shared_ptr<Plinth::MetaObj::MetaObject>()> shape;
     Body body;
     boost::shared_ptr<Plinth::CallSpec::Input> lastInput;
-    int inputSpecRequests = 0;
 
 private:
     ScriptedCommand() = default;

@@ -15,14 +15,10 @@
 
 using AddPolicyParameters = void (*)(boost::shared_ptr<Plinth::CallSpec::InputSpec>);
 
-inline boost::shared_ptr<Plinth::CallSpec::InputSpec> PolicySpec(AddPolicyParameters add) {
-    boost::shared_ptr<Plinth::CallSpec::InputSpec> inputSpec = Plinth::CallSpec::InputSpec::New();
-    add(inputSpec);
-    return inputSpec;
-}
-
 // Throws Plinth::Cli::UsageError for words the tool would refuse.
 inline boost::shared_ptr<Plinth::CallSpec::Input> ParsePolicyWords(AddPolicyParameters add,
                                                                    std::vector<std::string> const& words) {
-    return Plinth::Cli::ParseCommandOptions(*PolicySpec(add), words);
+    boost::shared_ptr<Plinth::CallSpec::InputSpec> inputSpec = Plinth::CallSpec::InputSpec::New();
+    add(inputSpec);
+    return Plinth::Cli::ParseCommandOptions(*inputSpec, words);
 }

@@ -1,5 +1,6 @@
-// The simulated host's standard switches, port groups and uplinks: what the
-// host refuses, and how it resolves the policies in force.
+// The simulated host's standard switches, port groups and uplinks: the bounds
+// the host keeps, and how it resolves the policies in force. The refusals the
+// commands pass on are proven in tests/cli/vswitch.test.sh.
 
 #include <functional>
 #include <memory>
@@ -12,16 +13,13 @@
 #include "SwitchTestSupport.h"
 #include "TempHost.h"
 #include "gantry/network/NetworkFactory.h"
+#include "gantry/network/PortGroup.h"
 #include "trellis/host/Description.h"
 #include "trellis/host/HostSession.h"
 #include "trellis/host/JsonReader.h"
-#include "trellis/network/NetworkInfoImpl.h"
-#include "trellis/network/PnicImpl.h"
-#include "trellis/network/PortGroupImpl.h"
 #include "trellis/network/PortsetImpl.h"
 #include "trellis/network/VirtualSwitchImpl.h"
 #include "trellis/network/VirtualSwitchInfoImpl.h"
-#include "util/VectorUtil"
 
 using namespace SwitchTest;
 using Gantry::Network::NetworkFactory;
@@ -52,9 +50,6 @@ void AddSwitch(const std::string& name, int numPorts) {
 
 TEST(SwitchHost, CreatingASwitchChecksItsNameAndThePortBudgetOfTheHost) {
     TempHost host;  // switch0 has 128 ports
-    const std::string before = Trellis::Host::ExportHost();
-    EXPECT_EQ(FailureOf([] { AddSwitch("switch0", 64); }),
-              "Unable to create virtual switch switch0: a virtual switch of that name already exists");
     EXPECT_EQ(FailureOf([] { AddSwitch("", 64); }), "Unable to create a virtual switch: its name must not be empty");
     EXPECT_EQ(FailureOf([] { AddSwitch("x", 0); }),
               "Unable to create virtual switch x: 0 is not a valid number of ports (1 to 4096)");
@@ -65,31 +60,16 @@ TEST(SwitchHost, CreatingASwitchChecksItsNameAndThePortBudgetOfTheHost) {
               "Unable to create virtual switch x: its 385 ports and the 4224 ports already allocated exceed the "
               "host's limit of 4608");
     AddSwitch("last", 384);  // exactly 4608
-
-    VirtualSwitchInfoImpl info;
-    std::vector<Gantry::Network::VirtualSwitch*> switches = info.GetVirtualSwitches();
-    ASSERT_EQ(switches.size(), 3u);
-    EXPECT_EQ(switches[1]->GetName(), "big");
-    EXPECT_EQ(switches[1]->GetConfiguredPorts(), 4096);
-    EXPECT_EQ(switches[1]->GetUsedPorts(), 0);
-    EXPECT_EQ(switches[1]->GetMtu(), 1500);
-    EXPECT_EQ(switches[1]->GetCdpStatus(), "listen");
-    EXPECT_EQ(switches[1]->GetClass(), "etherswitch");
-    Trellis::Util::DeleteVector(switches);
-    EXPECT_TRUE(Trellis::Host::ExportHost() != before);
+    EXPECT_EQ(Section("standardSwitches").size(), 3u);
 }
 
-TEST(SwitchHost, ASwitchWithClientsStaysAndOneWithoutGoesWithItsGroupsAndFreesItsUplinks) {
+TEST(SwitchHost, ARemovedSwitchGoesWithItsGroupsAndFreesItsUplinks) {
     TempHost host([](TempHost::Json& d) {
         d["standardSwitches"].push_back(SwitchEntry("switch1", 64, {"pnet1"}));
         d["portGroups"].push_back(PortGroupEntry("Storage", "switch1", 20));
     });
     VirtualSwitchInfoImpl info;
-    EXPECT_EQ(FailureOf([&] { info.RemoveVirtualSwitch("switch0"); }),
-              "Unable to remove virtual switch switch0: its port group Host Management has active clients");
     EXPECT_EQ(FailureOf([&] { info.RemoveVirtualSwitch("nosuch"); }), "Virtual switch nosuch does not exist");
-    EXPECT_EQ(Switch("switch0")["name"], "switch0");
-
     info.RemoveVirtualSwitch("switch1");
     EXPECT_FALSE(Trellis::Network::PortsetImpl::IsValidVirtualSwitch("switch1"));
     EXPECT_EQ(GroupNamed("Storage"), nullptr);
@@ -97,21 +77,9 @@ TEST(SwitchHost, ASwitchWithClientsStaysAndOneWithoutGoesWithItsGroupsAndFreesIt
     EXPECT_EQ(Switch("switch0")["uplinks"], Json({"pnet0", "pnet1"}));
 }
 
-TEST(SwitchHost, UplinksMustBeFreeNicsAndFitTheSwitch) {
+TEST(SwitchHost, AnUplinkTakesAPortOfTheSwitch) {
     TempHost host([](TempHost::Json& d) { d["standardSwitches"].push_back(SwitchEntry("tiny", 1)); });
-    const std::string before = Trellis::Host::ExportHost();
-    auto switch0 = SwitchNamed("switch0");
     auto tiny = SwitchNamed("tiny");
-    EXPECT_EQ(FailureOf([&] { switch0->AddUplink("pnet9"); }),
-              "Unable to add uplink pnet9 to virtual switch switch0: there is no physical NIC of that name");
-    EXPECT_EQ(FailureOf([&] { switch0->AddUplink("pnet0"); }),
-              "Unable to add uplink pnet0 to virtual switch switch0: it is already an uplink of this switch");
-    EXPECT_EQ(FailureOf([&] { tiny->AddUplink("pnet0"); }),
-              "Unable to add uplink pnet0 to virtual switch tiny: it is already an uplink of virtual switch switch0");
-    EXPECT_EQ(FailureOf([&] { switch0->RemoveUplink("pnet1"); }),
-              "Unable to remove uplink pnet1 from virtual switch switch0: it is not an uplink of this switch");
-    EXPECT_TRUE(Trellis::Host::ExportHost() == before);
-
     tiny->AddUplink("pnet1");
     EXPECT_EQ(tiny->GetUplinks(), Names{"pnet1"});  // the object sees its own change
     EXPECT_EQ(tiny->GetUsedPorts(), 1);
@@ -119,24 +87,13 @@ TEST(SwitchHost, UplinksMustBeFreeNicsAndFitTheSwitch) {
               "Unable to add uplink pnet2 to virtual switch tiny: all 1 ports of the switch are in use");
     tiny->RemoveUplink("pnet1");
     EXPECT_EQ(Switch("tiny")["uplinks"], Json::array());
-    EXPECT_TRUE(Trellis::Network::PnicImpl::IsValidPnic("pnet2"));
-    EXPECT_FALSE(Trellis::Network::PnicImpl::IsValidPnic("pnet9"));
 }
 
-TEST(SwitchHost, PortGroupsAreUniqueOnTheHostAndKeepTheirClients) {
+TEST(SwitchHost, APortGroupNeedsANameAndAVlanIdInRange) {
     TempHost host([](TempHost::Json& d) { d["standardSwitches"].push_back(SwitchEntry("switch1", 64)); });
-    auto switch0 = SwitchNamed("switch0");
     auto switch1 = SwitchNamed("switch1");
-    EXPECT_EQ(FailureOf([&] { delete switch1->AddPortGroup("Guest Network"); }),
-              "Unable to add port group Guest Network to virtual switch switch1: a port group of that name already "
-              "exists on virtual switch switch0");
     EXPECT_EQ(FailureOf([&] { delete switch1->AddPortGroup(""); }),
               "Unable to add port group  to virtual switch switch1: a port group name must not be empty");
-    EXPECT_EQ(FailureOf([&] { switch1->RemovePortGroup("Guest Network"); }),
-              "Unable to remove port group Guest Network from virtual switch switch1: the switch has no port group "
-              "of that name");
-    EXPECT_EQ(FailureOf([&] { switch0->RemovePortGroup("Guest Network"); }),
-              "Unable to remove port group Guest Network from virtual switch switch0: it has 1 active client");
 
     std::unique_ptr<Gantry::Network::PortGroup> storage(switch1->AddPortGroup("Storage"));
     EXPECT_EQ(storage->GetVirtualSwitchName(), "switch1");
@@ -148,14 +105,6 @@ TEST(SwitchHost, PortGroupsAreUniqueOnTheHostAndKeepTheirClients) {
     storage->SetVlanId(4095);
     EXPECT_EQ(storage->GetVlanId(), 4095);
     EXPECT_EQ(PortGroup("Storage")["vlanId"], 4095);
-
-    Trellis::Network::NetworkInfoImpl info;
-    std::vector<Gantry::Network::PortGroup*> groups = info.GetAllPortGroups();
-    ASSERT_EQ(groups.size(), 3u);
-    EXPECT_EQ(dynamic_cast<Trellis::Network::PortGroupImpl&>(*groups[1]).GetActiveClients(), 1);
-    EXPECT_EQ(dynamic_cast<Trellis::Network::PortGroupImpl&>(*groups[2]).GetActiveClients(), 0);
-    Trellis::Util::DeleteVector(groups);
-
     switch1->RemovePortGroup("Storage");
     EXPECT_EQ(GroupNamed("Storage"), nullptr);
     EXPECT_EQ(FailureOf([&] { storage->SetVlanId(1); }), "Port group Storage does not exist");
@@ -173,7 +122,6 @@ TEST(SwitchHost, MtuAndCdpStatusStayWithinWhatTheHostTakes) {
     EXPECT_EQ(switch0->GetMtu(), 9000);
     EXPECT_EQ(Switch("switch0")["mtu"], 9000);
     EXPECT_EQ(Switch("switch0")["cdpStatus"], "both");
-    EXPECT_EQ(FailureOf([] { SwitchNamed("nosuch"); }), "Virtual switch nosuch does not exist");
 }
 
 TEST(SwitchHost, ASwitchTakesWhatItDoesNotSetFromTheHostDefault) {
@@ -273,8 +221,6 @@ TEST(SwitchHost, TheDescriptionRefusesSwitchingThatCannotBe) {
              d["standardSwitches"].push_back(SwitchEntry("switch2", 385));
          },
          "standardSwitches[2].numPorts: the switches have more than 4608 ports in all"},
-        {[](Json& d) { d["standardSwitches"][0]["mtu"] = 1279; },
-         "standardSwitches[0].mtu: expected an integer from 1280 to 9000"},
         {[](Json& d) { d["portGroups"].push_back(PortGroupEntry("Guest Network", "switch0")); },
          "portGroups[2].name: duplicate port group \"Guest Network\""},
         {[](Json& d) { d["portGroups"][0]["vswitch"] = "nosuch"; },

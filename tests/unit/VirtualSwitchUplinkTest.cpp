@@ -1,4 +1,6 @@
-// network vswitch standard uplink add and remove.
+// network vswitch standard uplink add and remove: the teaming order left
+// alone, and the host's failures. The host's refusals with their texts are
+// proven in tests/cli/vswitch.test.sh.
 
 #include <string>
 #include <vector>
@@ -32,33 +34,13 @@ TEST(VirtualSwitchStandardUplink, AddsAndRemovesANic) {
     EXPECT_EQ(Switch("switch0")["uplinks"], Json({"pnet1"}));
 }
 
-TEST(VirtualSwitchStandardUplink, PassesOnWhatTheHostSays) {
+TEST(VirtualSwitchStandardUplink, HostFailuresPassOutAndChangeNothing) {
     TempHost host;
     const std::string before = Trellis::Host::ExportHost();
-    struct Case {
-        bool add;
-        std::vector<std::string> words;
-        std::string error;
-    };
-    const std::vector<Case> cases = {
-        {true, {"-v", "nosuch", "-u", "pnet1"}, "Virtual switch nosuch does not exist"},
-        {false, {"-v", "nosuch", "-u", "pnet0"}, "Virtual switch nosuch does not exist"},
-        {true, {"-v", "switch0", "-u", "pnet0"},
-         "Unable to add uplink pnet0 to virtual switch switch0: it is already an uplink of this switch"},
-        {true, {"-v", "switch0", "-u", "eth0"},
-         "Unable to add uplink eth0 to virtual switch switch0: there is no physical NIC of that name"},
-        {false, {"-v", "switch0", "-u", "pnet2"},
-         "Unable to remove uplink pnet2 from virtual switch switch0: it is not an uplink of this switch"},
-    };
-    for (const Case& c : cases) {
-        CommandRun run = c.add ? RunCommand<VirtualSwitchStandardUplinkAdd>(c.words)
-                               : RunCommand<VirtualSwitchStandardUplinkRemove>(c.words);
-        EXPECT_EQ(run.errors, Errors{c.error});
-        EXPECT_FALSE(run.HasResult());
-    }
     ArmFault({"VirtualSwitch::AddUplink", "driver not ready", 0, 1});
-    EXPECT_EQ(RunCommand<VirtualSwitchStandardUplinkAdd>({"-v", "switch0", "-u", "pnet1"}).errors,
-              Errors{"driver not ready"});
+    CommandRun run = RunCommand<VirtualSwitchStandardUplinkAdd>({"-v", "switch0", "-u", "pnet1"});
+    EXPECT_EQ(run.errors, Errors{"driver not ready"});
+    EXPECT_FALSE(run.HasResult());
     ArmFault({"NetworkFactory::GetVirtualSwitchById", "no factory", 0, 1});
     EXPECT_EQ(RunCommand<VirtualSwitchStandardUplinkRemove>({"-v", "switch0", "-u", "pnet0"}).errors,
               Errors{"no factory"});
