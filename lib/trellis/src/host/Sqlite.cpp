@@ -2,6 +2,8 @@
 
 #include <sqlite3.h>
 
+#include <utility>
+
 namespace Trellis {
 namespace Host {
 
@@ -23,7 +25,28 @@ Database::Database(const std::string& path, Mode mode) {
 }
 
 Database::~Database() {
+    for (auto& entry : idle_) sqlite3_finalize(entry.second);
     sqlite3_close_v2(db_);
+}
+
+sqlite3_stmt* Database::Acquire(const std::string& sql) {
+    auto idle = idle_.find(sql);
+    if (idle != idle_.end()) {
+        sqlite3_stmt* stmt = idle->second;
+        idle_.erase(idle);
+        return stmt;
+    }
+    sqlite3_stmt* stmt = nullptr;
+    int rc = sqlite3_prepare_v2(db_, sql.c_str(), static_cast<int>(sql.size()), &stmt, nullptr);
+    if (rc != SQLITE_OK) Fail(rc, "");
+    return stmt;
+}
+
+void Database::Release(const std::string& sql, sqlite3_stmt* stmt) {
+    sqlite3_reset(stmt);
+    sqlite3_clear_bindings(stmt);
+    // A second statement of the same text, used while the first was out, is not kept.
+    if (!idle_.emplace(sql, stmt).second) sqlite3_finalize(stmt);
 }
 
 void Database::Fail(int code, const std::string& what) const {
@@ -58,16 +81,14 @@ bool Database::InTransaction() const {
     return sqlite3_get_autocommit(db_) == 0;
 }
 
-Statement::Statement(Database& db, const std::string& sql) : db_(&db) {
-    int rc = sqlite3_prepare_v2(db.Handle(), sql.c_str(), static_cast<int>(sql.size()), &stmt_, nullptr);
-    if (rc != SQLITE_OK) db.Fail(rc, "");
-}
+Statement::Statement(Database& db, const std::string& sql) : db_(&db), sql_(sql), stmt_(db.Acquire(sql)) {}
 
 Statement::~Statement() {
-    sqlite3_finalize(stmt_);
+    if (stmt_) db_->Release(sql_, stmt_);
 }
 
-Statement::Statement(Statement&& other) noexcept : db_(other.db_), stmt_(other.stmt_) {
+Statement::Statement(Statement&& other) noexcept
+    : db_(other.db_), sql_(std::move(other.sql_)), stmt_(other.stmt_) {
     other.stmt_ = nullptr;
 }
 

@@ -1,12 +1,16 @@
 #pragma once
 
 // A thin RAII layer over the SQLite C API: one connection, prepared
-// statements with positional binding, and errors as SqliteError.
+// statements with positional binding, and errors as SqliteError. A connection
+// keeps the statements it prepared once and hands them out again, reset, for
+// the same SQL text: every host operation runs the same few queries, and
+// preparing them anew each time would cost more than running them.
 
 #include <cstdint>
 #include <optional>
 #include <stdexcept>
 #include <string>
+#include <unordered_map>
 
 struct sqlite3;
 struct sqlite3_stmt;
@@ -49,7 +53,14 @@ public:
     [[noreturn]] void Fail(int code, const std::string& what) const;
 
 private:
+    friend class Statement;
+    // A prepared statement for sql: an idle one kept from before, or a new one.
+    sqlite3_stmt* Acquire(const std::string& sql);
+    // Takes back a statement that is done, reset, for the next Acquire of sql.
+    void Release(const std::string& sql, sqlite3_stmt* stmt);
+
     sqlite3* db_ = nullptr;
+    std::unordered_map<std::string, sqlite3_stmt*> idle_;
 };
 
 class Statement {
@@ -82,6 +93,7 @@ public:
 
 private:
     Database* db_;
+    std::string sql_;
     sqlite3_stmt* stmt_ = nullptr;
 };
 

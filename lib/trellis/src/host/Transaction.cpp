@@ -100,7 +100,7 @@ void Transaction::EraseKind(const std::string& kind) {
 TransactionScope::TransactionScope(Store& store, bool write) : transaction_(store, write) {
     if (store.InTransaction())
         throw std::logic_error("A host operation started inside another one; operations do not nest");
-    GuardedSql(store, [&] { store.Db().Execute(write ? "BEGIN IMMEDIATE" : "BEGIN"); });
+    GuardedSql(store, [&] { store.Db().Prepare(write ? "BEGIN IMMEDIATE" : "BEGIN").Run(); });
     open_ = true;
 }
 
@@ -115,7 +115,7 @@ TransactionScope::~TransactionScope() {
 
 void TransactionScope::Commit() {
     Store& store = transaction_.GetStore();
-    GuardedSql(store, [&] { store.Db().Execute("COMMIT"); });
+    GuardedSql(store, [&] { store.Db().Prepare("COMMIT").Run(); });
     open_ = false;
 }
 
