@@ -36,14 +36,22 @@ std::vector<PortGroupRecord> PortGroupsOf(Transaction const& t, std::string cons
     return groups;
 }
 
-std::int64_t ClientPortsOf(Transaction const& t, std::string const& vswitch) {
+namespace {
+
+template <class Match>
+std::int64_t CountPorts(Transaction const& t, Match match) {
     std::vector<PortRecord> ports = t.List<PortRecord>();
-    return std::count_if(ports.begin(), ports.end(), [&](PortRecord const& port) { return port.portset == vswitch; });
+    return std::count_if(ports.begin(), ports.end(), match);
+}
+
+}  // namespace
+
+std::int64_t ClientPortsOf(Transaction const& t, std::string const& vswitch) {
+    return CountPorts(t, [&](PortRecord const& port) { return port.portset == vswitch; });
 }
 
 std::int64_t ActiveClientsOf(Transaction const& t, PortGroupRecord const& group) {
-    std::vector<PortRecord> ports = t.List<PortRecord>();
-    return std::count_if(ports.begin(), ports.end(), [&](PortRecord const& port) {
+    return CountPorts(t, [&](PortRecord const& port) {
         return port.portset == group.vswitch && port.portGroup == group.name;
     });
 }
