@@ -1,0 +1,25 @@
+#pragma once
+
+#include <cstddef>
+#include <string>
+
+namespace Plinth {
+namespace Cli {
+
+// Reads the code point that starts at text[position] and moves position past
+// it. False, with position unchanged, where the bytes there are not strict
+// UTF-8 (a stray or missing continuation byte, an overlong form, a surrogate,
+// a value above U+10FFFF) or the text ends.
+bool NextCodePoint(std::string const& text, std::size_t& position, char32_t& codePoint);
+
+bool IsValidUtf8(std::string const& text);
+
+// C0 controls, DEL and the C1 controls (U+0080 to U+009F).
+bool IsControl(char32_t codePoint);
+
+// Why a text may not be passed on to a command or the host: "is not valid
+// UTF-8" or "contains a control character"; "" for a text that may.
+std::string TextProblem(std::string const& text);
+
+}  // namespace Cli
+}  // namespace Plinth

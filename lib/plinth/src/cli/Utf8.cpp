@@ -1,0 +1,68 @@
+#include "plinth/cli/Utf8.h"
+
+namespace Plinth {
+namespace Cli {
+
+namespace {
+
+bool IsContinuation(unsigned char byte) { return (byte & 0xC0) == 0x80; }
+
+}  // namespace
+
+bool NextCodePoint(std::string const& text, std::size_t& position, char32_t& codePoint) {
+    if (position >= text.size()) return false;
+    unsigned char const lead = static_cast<unsigned char>(text[position]);
+    std::size_t length = 0;
+    char32_t value = 0;
+    char32_t smallest = 0;  // below this the form is overlong
+    if (lead < 0x80) {
+        codePoint = lead;
+        ++position;
+        return true;
+    } else if ((lead & 0xE0) == 0xC0) {
+        length = 2, value = lead & 0x1F, smallest = 0x80;
+    } else if ((lead & 0xF0) == 0xE0) {
+        length = 3, value = lead & 0x0F, smallest = 0x800;
+    } else if ((lead & 0xF8) == 0xF0) {
+        length = 4, value = lead & 0x07, smallest = 0x10000;
+    } else {
+        return false;
+    }
+    if (text.size() - position < length) return false;
+    for (std::size_t i = 1; i < length; ++i) {
+        unsigned char const byte = static_cast<unsigned char>(text[position + i]);
+        if (!IsContinuation(byte)) return false;
+        value = (value << 6) | (byte & 0x3F);
+    }
+    if (value < smallest || value > 0x10FFFF || (value >= 0xD800 && value <= 0xDFFF)) return false;
+    codePoint = value;
+    position += length;
+    return true;
+}
+
+bool IsValidUtf8(std::string const& text) {
+    std::size_t position = 0;
+    char32_t codePoint = 0;
+    while (position < text.size()) {
+        if (!NextCodePoint(text, position, codePoint)) return false;
+    }
+    return true;
+}
+
+bool IsControl(char32_t codePoint) {
+    return codePoint < 0x20 || (codePoint >= 0x7F && codePoint <= 0x9F);
+}
+
+std::string TextProblem(std::string const& text) {
+    std::size_t position = 0;
+    char32_t codePoint = 0;
+    bool control = false;
+    while (position < text.size()) {
+        if (!NextCodePoint(text, position, codePoint)) return "is not valid UTF-8";
+        control = control || IsControl(codePoint);
+    }
+    return control ? "contains a control character" : "";
+}
+
+}  // namespace Cli
+}  // namespace Plinth
