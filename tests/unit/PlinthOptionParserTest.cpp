@@ -3,6 +3,7 @@
 #include <gtest/gtest.h>
 
 #include "PlinthScriptedCommand.h"
+#include "plinth/callspec/Parameter.h"
 #include "plinth/cli/OptionParser.h"
 #include "plinth/cli/UsageError.h"
 #include "plinth/cli/ValueParser.h"
@@ -14,35 +15,19 @@ using PlinthTest::MakeParameter;
 
 namespace {
 
-boost::shared_ptr<ParameterSpec> Constrained(std::string const& name, ParameterType type,
-                                             boost::shared_ptr<ParameterConstraint> constraint) {
-    boost::shared_ptr<ParameterSpec> parameter = ParameterSpec::New(name, type);
-    parameter->SetConstraint(constraint);
-    return parameter;
-}
+// One parameter of each type and each constraint kind, declared as commands do.
+const Parameter kName = Parameter::String("name", "n", "");
+const Parameter kCount = Parameter::Int64("count", "c", "");
+const Parameter kMtu = Parameter::Int("mtu", "m", "");
+const Parameter kEnabled = Parameter::Bool("enabled", "e", "");
+const Parameter kVerbose = Parameter::Flag("verbose", "v", "");
+const Parameter kPorts = Parameter::Int("ports", "", "").Range(1, 4096);
+const Parameter kSpeed = Parameter::Int("speed", "", "").IntEnum({10, 100});
+const Parameter kType = Parameter::String("type", "", "").StringEnum({{"static", ""}, {"dhcp", ""}});
+const Parameter kInterface = Parameter::String("interface", "", "").Regex("tsl[0-9]+");
 
 boost::shared_ptr<InputSpec> OptionsSpec() {
-    boost::shared_ptr<InputSpec> inputSpec = InputSpec::New();
-    inputSpec->AddParameter(MakeParameter("name", PARAMETER_STRING, "n"));
-    inputSpec->AddParameter(MakeParameter("count", PARAMETER_INT, "c"));
-    inputSpec->AddParameter(MakeParameter("enabled", PARAMETER_BOOL, "e"));
-    inputSpec->AddParameter(MakeParameter("verbose", PARAMETER_FLAG, "v"));
-
-    boost::shared_ptr<ParameterConstraint> range = ParameterConstraint::New(CONSTRAINT_INT_RANGE);
-    range->SetIntRange(1, 4096);
-    inputSpec->AddParameter(Constrained("ports", PARAMETER_INT, range));
-    boost::shared_ptr<ParameterConstraint> speeds = ParameterConstraint::New(CONSTRAINT_INT_ENUM);
-    speeds->AddIntEnum(10);
-    speeds->AddIntEnum(100);
-    inputSpec->AddParameter(Constrained("speed", PARAMETER_INT, speeds));
-    boost::shared_ptr<ParameterConstraint> types = ParameterConstraint::New(CONSTRAINT_STRING_ENUM);
-    types->AddStringEnum("static", "");
-    types->AddStringEnum("dhcp", "");
-    inputSpec->AddParameter(Constrained("type", PARAMETER_STRING, types));
-    boost::shared_ptr<ParameterConstraint> pattern = ParameterConstraint::New(CONSTRAINT_STRING_REGEX);
-    pattern->SetStringRegex("tsl[0-9]+");
-    inputSpec->AddParameter(Constrained("interface", PARAMETER_STRING, pattern));
-    return inputSpec;
+    return InputSpecOf(kName, kCount, kMtu, kEnabled, kVerbose, kPorts, kSpeed, kType, kInterface);
 }
 
 boost::shared_ptr<Input> Parse(std::vector<std::string> const& words) { return ParseCommandOptions(*OptionsSpec(), words); }
@@ -84,7 +69,17 @@ TEST(PlinthOptionParser, BooleansAcceptThreeSpellingsInAnyCase) {
     EXPECT_NE("", Refusal({"-e", "2"}));
 }
 
-TEST(PlinthOptionParser, IntegersAreDecimal64BitAndNothingElse) {
+TEST(PlinthOptionParser, IntegersAreDecimalAndFitWhatTheCommandReads) {
+    // An option read with GetInt takes the 32-bit range, one read as 64 bits the whole range.
+    EXPECT_EQ(2147483647, Parse({"-m", "2147483647"})->GetInt("mtu"));
+    EXPECT_EQ(-2147483647 - 1, Parse({"-m", "-2147483648"})->GetInt("mtu"));
+    EXPECT_EQ("Invalid value for option --mtu: '2147483648' is outside the 32-bit integer range "
+              "(-2147483648 to 2147483647).",
+              Refusal({"-m", "2147483648"}));
+    EXPECT_NE("", Refusal({"--mtu=-2147483649"}));
+    EXPECT_NE("", Refusal({"--mtu=4294968796"}));
+    EXPECT_EQ(2147483648LL, Parse({"-c", "2147483648"})->GetLongLong("count"));
+    EXPECT_EQ(-2147483649LL, Parse({"-c", "-2147483649"})->GetLongLong("count"));
     EXPECT_EQ(9223372036854775807LL, Parse({"-c", "9223372036854775807"})->GetLongLong("count"));
     EXPECT_EQ(-9223372036854775807LL - 1, Parse({"-c", "-9223372036854775808"})->GetLongLong("count"));
     EXPECT_EQ("Invalid value for option --count: '9223372036854775808' is outside the 64-bit integer range.",
@@ -132,6 +127,22 @@ TEST(PlinthOptionParser, RefusesMalformedCommandLines) {
     EXPECT_EQ("Unexpected argument 'extra'.", Refusal({"-v", "extra"}));
     // A flag does not swallow the next word.
     EXPECT_EQ("Unexpected argument 'true'.", Refusal({"-v", "true"}));
+}
+
+TEST(PlinthOptionParser, TextsMustBeUtf8WithoutControlCharacters) {
+    EXPECT_EQ("Gr\xc3\xbcn \xe7\xbd\x91", Parse({"-n", "Gr\xc3\xbcn \xe7\xbd\x91"})->GetString("name"));
+    EXPECT_EQ("Invalid value for option --name: 'bad\\xFF' is not valid UTF-8.", Refusal({"-n", "bad\xff"}));
+    // An overlong form and a lone surrogate are not UTF-8 either.
+    EXPECT_NE("", Refusal({"-n", "\xc0\xaf"}));
+    EXPECT_NE("", Refusal({"-n", "\xed\xa0\x80"}));
+    EXPECT_EQ("Invalid value for option --name: 'a\\x0Ab' contains a control character.", Refusal({"-n", "a\nb"}));
+    EXPECT_NE("", Refusal({"--name=tab\there"}));
+    EXPECT_NE("", Refusal({"--name=c1\xc2\x85"}));
+    // A value of another type is checked as a text first; refusals quote a bad word visibly.
+    EXPECT_EQ("Invalid value for option --mtu: '1\\x00' contains a control character.",
+              Refusal({"--mtu", std::string("1\0", 2)}));
+    EXPECT_EQ("Unexpected argument '\\xFE'.", Refusal({"\xfe"}));
+    EXPECT_EQ("Unknown option --x\\x1B.", Refusal({"--x\x1b"}));
 }
 
 TEST(PlinthOptionParser, RequiredOptionsMustBeGiven) {

@@ -1,6 +1,7 @@
 #include "plinth/cli/GlobalOptions.h"
 
 #include "plinth/cli/UsageError.h"
+#include "plinth/cli/Utf8.h"
 
 namespace Plinth {
 namespace Cli {
@@ -40,7 +41,7 @@ GlobalOptions ParseGlobalOptions(std::vector<std::string> const& words) {
             options.help = true;
         } else if (!ReadValueOption("host", words, i, options.host, hostSeen) &&
                    !ReadValueOption("formatter", words, i, options.formatter, formatterSeen)) {
-            throw UsageError("Unknown option " + words[i] + ".");
+            throw UsageError("Unknown option " + VisibleText(words[i]) + ".");
         }
     }
     options.commandWords.assign(words.begin() + static_cast<long>(i), words.end());

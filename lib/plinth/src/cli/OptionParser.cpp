@@ -1,9 +1,11 @@
 #include "plinth/cli/OptionParser.h"
 
+#include <cstdint>
 #include <set>
 
 #include "plinth/cli/ConstraintCheck.h"
 #include "plinth/cli/UsageError.h"
+#include "plinth/cli/Utf8.h"
 #include "plinth/cli/ValueParser.h"
 
 namespace Plinth {
@@ -48,9 +50,19 @@ void RefuseValue(std::string const& option, std::string const& reason) {
     Refuse("Invalid value for option " + option + ": " + reason + ".");
 }
 
+// What an int parameter's width lets through, as a refusal; "" when it fits.
+std::string CheckIntWidth(ParameterSpec const& parameter, std::string const& text, long long value) {
+    if (parameter.GetIntWidth() == CallSpec::IntWidth::Int64) return "";
+    if (value >= INT32_MIN && value <= INT32_MAX) return "";
+    return "'" + text + "' is outside the 32-bit integer range (" + std::to_string(INT32_MIN) + " to " +
+           std::to_string(INT32_MAX) + ")";
+}
+
 void StoreValue(ParameterSpec const& parameter, std::string const& text, Input& input) {
     std::string const option = "--" + parameter.GetName();
     boost::shared_ptr<CallSpec::ParameterConstraint> const constraint = parameter.GetConstraint();
+    std::string const problem = TextProblem(text);
+    if (!problem.empty()) RefuseValue(option, "'" + VisibleText(text) + "' " + problem);
     switch (parameter.GetType()) {
     case CallSpec::PARAMETER_BOOL: {
         bool value = false;
@@ -72,6 +84,8 @@ void StoreValue(ParameterSpec const& parameter, std::string const& text, Input& 
         case IntParse::Ok:
             break;
         }
+        std::string const tooWide = CheckIntWidth(parameter, text, value);
+        if (!tooWide.empty()) RefuseValue(option, tooWide);
         if (constraint) {
             std::string const reason = CheckIntConstraint(*constraint, value);
             if (!reason.empty()) RefuseValue(option, reason);
@@ -96,11 +110,11 @@ boost::shared_ptr<Input> ParseCommandOptions(InputSpec const& inputSpec, std::ve
     boost::shared_ptr<Input> input = Input::New();
     std::set<std::string> given;
     for (size_t i = 0; i < words.size(); ++i) {
-        if (!IsOptionWord(words[i])) Refuse("Unexpected argument '" + words[i] + "'.");
+        if (!IsOptionWord(words[i])) Refuse("Unexpected argument '" + VisibleText(words[i]) + "'.");
         OptionWord option = SplitOption(words[i]);
         boost::shared_ptr<ParameterSpec> const parameter =
             option.isShort ? inputSpec.FindByShortName(option.name) : inputSpec.FindByName(option.name);
-        if (!parameter) Refuse("Unknown option " + option.typed + ".");
+        if (!parameter) Refuse("Unknown option " + VisibleText(option.typed) + ".");
 
         std::string const longOption = "--" + parameter->GetName();
         if (!given.insert(parameter->GetName()).second) {

@@ -51,6 +51,8 @@ void LoadPlugins(std::vector<std::string> const& files, boost::shared_ptr<AutoCl
             reinterpret_cast<AutoCli_RegisterNamespacesFn>(symbol)(root);
         } catch (std::exception const& failure) {
             throw PluginLoadError("The plug-in " + file + " failed to register its commands: " + failure.what());
+        } catch (...) {
+            throw PluginLoadError("The plug-in " + file + " failed to register its commands.");
         }
     }
 }

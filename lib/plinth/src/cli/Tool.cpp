@@ -7,6 +7,7 @@
 #include "plinth/cli/Formatter.h"
 #include "plinth/cli/OptionParser.h"
 #include "plinth/cli/UsageError.h"
+#include "plinth/cli/Utf8.h"
 
 namespace Plinth {
 namespace Cli {
@@ -23,6 +24,14 @@ struct HostUnavailable {
     std::string text;
 };
 
+char const* const kUnknownException = "The command failed with an unknown exception.";
+
+// An exception's text as the one line that reports it.
+std::string OneLine(std::string const& text) {
+    if (text.empty()) return kUnknownException;
+    return VisibleText(text);
+}
+
 std::string AvailableFormatters() {
     std::string names;
     for (std::string const& name : FormatterNames()) names += (names.empty() ? "" : ", ") + name;
@@ -35,6 +44,17 @@ Tool::Tool(boost::shared_ptr<NamespaceNode> root, std::string programName, HostO
     : root_(root), help_(std::move(programName)), openHost_(std::move(openHost)) {}
 
 int Tool::Run(std::vector<std::string> const& words, std::ostream& out, std::ostream& err) {
+    try {
+        return RunWords(words, out, err);
+    } catch (std::exception const& failure) {
+        err << OneLine(failure.what()) << "\n";
+    } catch (...) {
+        err << kUnknownException << "\n";
+    }
+    return EXIT_FAILED;
+}
+
+int Tool::RunWords(std::vector<std::string> const& words, std::ostream& out, std::ostream& err) {
     GlobalOptions options;
     try {
         options = ParseGlobalOptions(words);
@@ -43,7 +63,7 @@ int Tool::Run(std::vector<std::string> const& words, std::ostream& out, std::ost
         return EXIT_REFUSED;
     }
     if (!options.formatter.empty() && !MakeFormatter(options.formatter)) {
-        err << "Error: Unknown formatter '" << options.formatter << "'. Available formatters: " << AvailableFormatters()
+        err << "Error: Unknown formatter '" << VisibleText(options.formatter) << "'. Available formatters: " << AvailableFormatters()
             << ".\n";
         return EXIT_REFUSED;
     }
@@ -57,7 +77,7 @@ int Tool::Run(std::vector<std::string> const& words, std::ostream& out, std::ost
     if (!command) {
         if (!rest.empty() && rest.front() != "--help") {
             std::string const where = node->GetPathString(' ');
-            err << "Error: Unknown command or namespace " << (where.empty() ? "" : where + " ") << rest.front()
+            err << "Error: Unknown command or namespace " << (where.empty() ? "" : where + " ") << VisibleText(rest.front())
                 << ".\n\n"
                 << help_.NamespaceHelp(*node);
             return EXIT_REFUSED;
@@ -130,9 +150,9 @@ int Tool::RunCommand(Command& command, GlobalOptions const& options, std::vector
     try {
         command.Execute(input, output);
     } catch (std::exception const& failure) {
-        escaped = failure.what();
+        escaped = OneLine(failure.what());
     } catch (...) {
-        escaped = "The command failed with an unknown exception.";
+        escaped = kUnknownException;
     }
 
     for (std::string const& text : output->GetErrors()) err << text << "\n";

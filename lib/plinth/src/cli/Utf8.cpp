@@ -1,5 +1,7 @@
 #include "plinth/cli/Utf8.h"
 
+#include <cstdio>
+
 namespace Plinth {
 namespace Cli {
 
@@ -62,6 +64,27 @@ std::string TextProblem(std::string const& text) {
         control = control || IsControl(codePoint);
     }
     return control ? "contains a control character" : "";
+}
+
+std::string VisibleText(std::string const& text) {
+    std::string visible;
+    std::size_t position = 0;
+    while (position < text.size()) {
+        std::size_t const start = position;
+        char32_t codePoint = 0;
+        char escape[8];
+        if (!NextCodePoint(text, position, codePoint)) {
+            std::snprintf(escape, sizeof escape, "\\x%02X", static_cast<unsigned char>(text[position++]));
+            visible += escape;
+        } else if (IsControl(codePoint)) {
+            std::snprintf(escape, sizeof escape, codePoint < 0x80 ? "\\x%02X" : "\\u%04X",
+                          static_cast<unsigned>(codePoint));
+            visible += escape;
+        } else {
+            visible.append(text, start, position - start);
+        }
+    }
+    return visible;
 }
 
 }  // namespace Cli

@@ -12,6 +12,8 @@ namespace CallSpec {
 class OutputSpec {
 public:
     static boost::shared_ptr<OutputSpec> New();
+    // Beyond the commands' operations: New and SetResultType in one call.
+    static boost::shared_ptr<OutputSpec> Of(boost::shared_ptr<MetaObj::MetaObject> resultType);
 
     virtual ~OutputSpec();
 

@@ -27,6 +27,9 @@ public:
     virtual void SetDescription(std::string const& description);
     virtual void SetConstraint(boost::shared_ptr<ParameterConstraint> constraint);
     virtual void SetRequired(bool required);
+    // Beyond the commands' operations: the width of an int parameter's value
+    // (Int32 unless set).
+    void SetIntWidth(IntWidth width);
 
     // Read access for the tool.
     std::string const& GetName() const;
@@ -35,6 +38,7 @@ public:
     std::string const& GetDescription() const;
     boost::shared_ptr<ParameterConstraint> GetConstraint() const;
     bool IsRequired() const;
+    IntWidth GetIntWidth() const;
 
 private:
     ParameterSpec(std::string const& name, ParameterType type);
@@ -45,6 +49,7 @@ private:
     std::string description_;
     boost::shared_ptr<ParameterConstraint> constraint_;
     bool required_ = false;
+    IntWidth intWidth_ = IntWidth::Int32;
 };
 
 }  // namespace CallSpec

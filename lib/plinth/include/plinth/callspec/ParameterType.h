@@ -12,5 +12,10 @@ enum ParameterType {
     PARAMETER_FLAG = 3,
 };
 
+// How much of an int parameter the command reads: GetInt reads a 32-bit int,
+// so the tool refuses a value outside that range; a command that reads the
+// value as 64 bits (GetLongLong) takes the whole signed 64-bit range.
+enum class IntWidth { Int32, Int64 };
+
 }  // namespace CallSpec
 }  // namespace Plinth

@@ -34,9 +34,12 @@ public:
 
     // words: the command line after the program name. Writes the result and
     // help to out, error texts and refusals to err; returns the exit status.
+    // An exception that escapes a command or the tool itself is reported as
+    // one line, with status 1.
     int Run(std::vector<std::string> const& words, std::ostream& out, std::ostream& err);
 
 private:
+    int RunWords(std::vector<std::string> const& words, std::ostream& out, std::ostream& err);
     int RunCommand(AutoCli::Command& command, GlobalOptions const& options, std::vector<std::string> const& words,
                    std::ostream& out, std::ostream& err);
     int ShowCommandHelp(AutoCli::Command& command, GlobalOptions const& options, std::ostream& out,

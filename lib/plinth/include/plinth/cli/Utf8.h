@@ -21,5 +21,10 @@ bool IsControl(char32_t codePoint);
 // UTF-8" or "contains a control character"; "" for a text that may.
 std::string TextProblem(std::string const& text);
 
+// The text as a message may quote it: a control character or a byte that is
+// not part of valid UTF-8 is written as \xHH (\u0085 for a C1 control), so
+// a refusal names a bad word without printing it raw.
+std::string VisibleText(std::string const& text);
+
 }  // namespace Cli
 }  // namespace Plinth
