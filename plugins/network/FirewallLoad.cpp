@@ -1,10 +1,6 @@
 #include "FirewallLoad.h"
 
-#include "gantry/lib/GantryException.h"
-#include "plinth/callspec/InputSpec.h"
-#include "plinth/callspec/Output.h"
-#include "plinth/callspec/OutputSpec.h"
-#include "plinth/metaobj/MetaBool.h"
+#include "CommandSupport.h"
 #include "trellis/system/ModuleImpl.h"
 #include "trellis/system/SystemInfoImpl.h"
 
@@ -16,31 +12,20 @@ FirewallLoad::FirewallLoad() {
     SetMetaDataField("type", "operation");
 }
 
-FirewallLoad::~FirewallLoad() {}
+boost::shared_ptr<InputSpec> FirewallLoad::GetInputSpecInternal() { return InputSpec::New(); }
 
-boost::shared_ptr<FirewallLoad> FirewallLoad::New() { return boost::shared_ptr<FirewallLoad>(new FirewallLoad()); }
+boost::shared_ptr<OutputSpec> FirewallLoad::GetOutputSpecInternal() { return OutputSpec::Of(MetaBool::New()); }
 
-boost::shared_ptr<Plinth::CallSpec::InputSpec> FirewallLoad::GetInputSpecInternal() {
-    return Plinth::CallSpec::InputSpec::New();
-}
-
-boost::shared_ptr<Plinth::CallSpec::OutputSpec> FirewallLoad::GetOutputSpecInternal() {
-    boost::shared_ptr<Plinth::CallSpec::OutputSpec> outputSpec = Plinth::CallSpec::OutputSpec::New();
-    outputSpec->SetResultType(Plinth::MetaObj::MetaBool::New());
-    return outputSpec;
-}
-
-void FirewallLoad::ExecuteInternal(boost::shared_ptr<Plinth::CallSpec::Input> /*input*/,
-                                   boost::shared_ptr<Plinth::CallSpec::Output> output) {
+void FirewallLoad::ExecuteInternal(boost::shared_ptr<Input> /*input*/, boost::shared_ptr<Output> output) {
     Trellis::System::SystemInfoImpl systemInfo;
     try {
         // Whatever the module answers for a module that is loaded already stands.
         Trellis::System::ModuleImpl module("haldenfw");
         module.Load("", false);
         systemInfo.LoadFirewallRulesets();
-        output->SetResult(Plinth::MetaObj::MetaBool::New(true));
+        output->SetResult(MetaBool::New(true));
         output->Finish();
-    } catch (Gantry::Lib::GantryException& e) {
+    } catch (GantryException& e) {
         output->SetError(e.GetMessage(0));
     }
 }

@@ -1,23 +1,16 @@
 #include "FirewallRulesetList.h"
 
-#include <vector>
-
+#include "CommandSupport.h"
 #include "FirewallRulesetSelection.h"
-#include "gantry/lib/GantryException.h"
-#include "gantry/system/FirewallRuleset.h"
-#include "plinth/callspec/Input.h"
-#include "plinth/callspec/InputSpec.h"
-#include "plinth/callspec/Output.h"
-#include "plinth/callspec/OutputSpec.h"
-#include "plinth/callspec/ParameterSpec.h"
-#include "plinth/metaobj/MetaBool.h"
-#include "plinth/metaobj/MetaList.h"
-#include "plinth/metaobj/MetaString.h"
-#include "trellis/system/SystemInfoImpl.h"
-#include "util/VectorUtil"
 
 namespace KorvexCli {
 namespace NetworkNamespace {
+
+namespace {
+
+const Parameter kRulesetId = Parameter::String("ruleset-id", "r", "List configuration for specfic ruleset");
+
+}  // namespace
 
 FirewallRulesetList::FirewallRulesetList() {
     SetDescription("List the rulesets in firewall.");
@@ -26,59 +19,37 @@ FirewallRulesetList::FirewallRulesetList() {
     SetDefaultOutputParameter("fields:Ruleset", "Name,Enabled");
 }
 
-FirewallRulesetList::~FirewallRulesetList() {}
+boost::shared_ptr<InputSpec> FirewallRulesetList::GetInputSpecInternal() { return InputSpecOf(kRulesetId); }
 
-boost::shared_ptr<FirewallRulesetList> FirewallRulesetList::New() {
-    return boost::shared_ptr<FirewallRulesetList>(new FirewallRulesetList());
+boost::shared_ptr<OutputSpec> FirewallRulesetList::GetOutputSpecInternal() {
+    return OutputSpec::Of(MetaList::New(3, GetOutputStructure()));
 }
 
-boost::shared_ptr<Plinth::CallSpec::InputSpec> FirewallRulesetList::GetInputSpecInternal() {
-    boost::shared_ptr<Plinth::CallSpec::InputSpec> inputSpec = Plinth::CallSpec::InputSpec::New();
-
-    boost::shared_ptr<Plinth::CallSpec::ParameterSpec> rulesetId =
-        Plinth::CallSpec::ParameterSpec::New("ruleset-id", Plinth::CallSpec::PARAMETER_STRING);
-    rulesetId->SetRequired(false);
-    rulesetId->SetShortName("r");
-    rulesetId->SetDescription("List configuration for specfic ruleset");
-    inputSpec->AddParameter(rulesetId);
-
-    return inputSpec;
-}
-
-boost::shared_ptr<Plinth::CallSpec::OutputSpec> FirewallRulesetList::GetOutputSpecInternal() {
-    boost::shared_ptr<Plinth::CallSpec::OutputSpec> outputSpec = Plinth::CallSpec::OutputSpec::New();
-    outputSpec->SetResultType(Plinth::MetaObj::MetaList::New(3, GetOutputStructure()));
-    return outputSpec;
-}
-
-boost::shared_ptr<Plinth::MetaObj::MetaStruct> FirewallRulesetList::GetOutputStructure() {
-    boost::shared_ptr<Plinth::MetaObj::MetaStruct> result = Plinth::MetaObj::MetaStruct::New("Ruleset");
-    result->SetField("Name", Plinth::MetaObj::MetaString::New());
-    result->SetField("Enabled", Plinth::MetaObj::MetaBool::New());
+boost::shared_ptr<MetaStruct> FirewallRulesetList::GetOutputStructure() {
+    boost::shared_ptr<MetaStruct> result = MetaStruct::New("Ruleset");
+    result->SetField("Name", MetaString::New());
+    result->SetField("Enabled", MetaBool::New());
     return result;
 }
 
-void FirewallRulesetList::ExecuteInternal(boost::shared_ptr<Plinth::CallSpec::Input> input,
-                                          boost::shared_ptr<Plinth::CallSpec::Output> output) {
+void FirewallRulesetList::ExecuteInternal(boost::shared_ptr<Input> input, boost::shared_ptr<Output> output) {
     Trellis::System::SystemInfoImpl systemInfo;
-    boost::shared_ptr<Plinth::MetaObj::MetaList> result = Plinth::MetaObj::MetaList::New(3, GetOutputStructure());
-    std::vector<Gantry::System::FirewallRuleset*> rulesets;
-    if (!SelectFirewallRulesets(systemInfo, input, output, rulesets)) {
+    boost::shared_ptr<MetaList> result = MetaList::New(3, GetOutputStructure());
+    OwnedVector<Gantry::System::FirewallRuleset> rulesets;
+    if (!SelectFirewallRulesets(systemInfo, input, kRulesetId, output, rulesets)) {
         return;
     }
     try {
         for (Gantry::System::FirewallRuleset* ruleset : rulesets) {
-            boost::shared_ptr<Plinth::MetaObj::MetaStruct> row = GetOutputStructure();
-            row->SetField("Enabled", Plinth::MetaObj::MetaBool::New(ruleset->IsEnabled()));
-            row->SetField("Name", Plinth::MetaObj::MetaString::New(ruleset->GetName()));
+            boost::shared_ptr<MetaStruct> row = GetOutputStructure();
+            row->SetField("Enabled", MetaBool::New(ruleset->IsEnabled()));
+            row->SetField("Name", MetaString::New(ruleset->GetName()));
             result->AddMetaStruct(row);
         }
-    } catch (Gantry::Lib::GantryException& e) {
-        Trellis::Util::DeleteVector(rulesets);
+    } catch (GantryException& e) {
         output->SetError(e.GetMessage(0));
         return;
     }
-    Trellis::Util::DeleteVector(rulesets);
     output->SetResult(result);
     output->Finish();
 }

@@ -1,24 +1,13 @@
 #pragma once
 
-#include <boost/shared_ptr.hpp>
-
-#include "plinth/autocli/Command.h"
+#include "plinth/autocli/CommandClass.h"
 
 namespace KorvexCli {
 namespace NetworkNamespace {
 
+// network firewall set
 class FirewallSet : public virtual Plinth::AutoCli::Command {
-public:
-    static boost::shared_ptr<FirewallSet> New();
-    ~FirewallSet() override;
-
-    boost::shared_ptr<Plinth::CallSpec::InputSpec> GetInputSpecInternal() override;
-    boost::shared_ptr<Plinth::CallSpec::OutputSpec> GetOutputSpecInternal() override;
-    void ExecuteInternal(boost::shared_ptr<Plinth::CallSpec::Input> input,
-                         boost::shared_ptr<Plinth::CallSpec::Output> output) override;
-
-private:
-    FirewallSet();
+    PLINTH_COMMAND_CLASS(FirewallSet)
 };
 
 }  // namespace NetworkNamespace

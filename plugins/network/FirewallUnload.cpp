@@ -1,10 +1,6 @@
 #include "FirewallUnload.h"
 
-#include "gantry/lib/GantryException.h"
-#include "plinth/callspec/InputSpec.h"
-#include "plinth/callspec/Output.h"
-#include "plinth/callspec/OutputSpec.h"
-#include "plinth/metaobj/MetaBool.h"
+#include "CommandSupport.h"
 #include "trellis/system/ModuleImpl.h"
 #include "trellis/system/SystemInfoImpl.h"
 
@@ -16,24 +12,11 @@ FirewallUnload::FirewallUnload() {
     SetMetaDataField("type", "operation");
 }
 
-FirewallUnload::~FirewallUnload() {}
+boost::shared_ptr<InputSpec> FirewallUnload::GetInputSpecInternal() { return InputSpec::New(); }
 
-boost::shared_ptr<FirewallUnload> FirewallUnload::New() {
-    return boost::shared_ptr<FirewallUnload>(new FirewallUnload());
-}
+boost::shared_ptr<OutputSpec> FirewallUnload::GetOutputSpecInternal() { return OutputSpec::Of(MetaBool::New()); }
 
-boost::shared_ptr<Plinth::CallSpec::InputSpec> FirewallUnload::GetInputSpecInternal() {
-    return Plinth::CallSpec::InputSpec::New();
-}
-
-boost::shared_ptr<Plinth::CallSpec::OutputSpec> FirewallUnload::GetOutputSpecInternal() {
-    boost::shared_ptr<Plinth::CallSpec::OutputSpec> outputSpec = Plinth::CallSpec::OutputSpec::New();
-    outputSpec->SetResultType(Plinth::MetaObj::MetaBool::New());
-    return outputSpec;
-}
-
-void FirewallUnload::ExecuteInternal(boost::shared_ptr<Plinth::CallSpec::Input> /*input*/,
-                                     boost::shared_ptr<Plinth::CallSpec::Output> output) {
+void FirewallUnload::ExecuteInternal(boost::shared_ptr<Input> /*input*/, boost::shared_ptr<Output> output) {
     Trellis::System::SystemInfoImpl systemInfo;
     try {
         Trellis::System::ModuleImpl module("haldenfw");
@@ -41,9 +24,9 @@ void FirewallUnload::ExecuteInternal(boost::shared_ptr<Plinth::CallSpec::Input> 
             systemInfo.DestroyFirewallFilters();
             module.Unload();
         }
-        output->SetResult(Plinth::MetaObj::MetaBool::New(true));
+        output->SetResult(MetaBool::New(true));
         output->Finish();
-    } catch (Gantry::Lib::GantryException& e) {
+    } catch (GantryException& e) {
         output->SetError(e.GetMessage(0));
     }
 }

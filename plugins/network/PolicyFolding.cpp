@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <cstdint>
 
+#include "PolicyParameters.h"
 #include "UplinkList.h"
 #include "gantry/network/LinkCriteriaSelectionPolicy.h"
 #include "gantry/network/TeamPolicyType.h"
@@ -16,8 +17,6 @@ using Gantry::Network::NicTeamingPolicy;
 using Gantry::Network::PortSecurityPolicy;
 using Gantry::Network::ShapingPolicy;
 using Gantry::Network::TeamPolicyType;
-using Plinth::CallSpec::Input;
-using Plinth::CallSpec::Output;
 
 namespace {
 
@@ -28,8 +27,7 @@ bool Contains(std::vector<std::string> const& names, std::string const& name) {
 // Appends to ordered each name of the list that is a known NIC connected to
 // the switch, and reports each other one. unknownNicText names the list.
 void AppendUsableUplinks(std::string const& list, std::string const& unknownNicText,
-                         std::vector<std::string> const& connected, Output& output,
-                         std::vector<std::string>& ordered) {
+                         std::vector<std::string> const& connected, Output& output, std::vector<std::string>& ordered) {
     for (std::string const& name : SplitUplinks(list)) {
         if (!Trellis::Network::PnicImpl::IsValidPnic(name)) {
             output.SetError(unknownNicText + name);
@@ -63,8 +61,7 @@ void PrependPresentActive(NicTeamingPolicy const& reference, NicTeamingPolicy& p
                           std::vector<std::string>& ordered) {
     std::vector<std::string> present = reference.uplinkOrder;
     std::int32_t count = reference.maxActiveUplinks;
-    for (std::size_t position = 0;
-         static_cast<std::int64_t>(position) < count && position < present.size();) {
+    for (std::size_t position = 0; static_cast<std::int64_t>(position) < count && position < present.size();) {
         if (Contains(ordered, present[position])) {
             present.erase(present.begin() + position);
             --count;
@@ -87,11 +84,10 @@ bool HasDuplicate(std::vector<std::string> names) {
 
 }  // namespace
 
-void SetFailoverPolicy(boost::shared_ptr<Input> input, boost::shared_ptr<Output> output,
-                       NicTeamingPolicy& policy, NicTeamingPolicy& reference,
-                       std::vector<std::string> const& connected) {
-    if (input->HasParameter("load-balancing")) {
-        std::string word = input->GetString("load-balancing");
+void SetFailoverPolicy(boost::shared_ptr<Input> input, boost::shared_ptr<Output> output, NicTeamingPolicy& policy,
+                       NicTeamingPolicy& reference, std::vector<std::string> const& connected) {
+    if (input->HasParameter(kLoadBalancing)) {
+        std::string word = input->GetString(kLoadBalancing);
         if (word == "portid") {
             policy.SetTeamingPolicy(TeamPolicyType::OriginatingPort);
         } else if (word == "iphash") {
@@ -105,8 +101,8 @@ void SetFailoverPolicy(boost::shared_ptr<Input> input, boost::shared_ptr<Output>
         }
     }
 
-    if (input->HasParameter("failure-detection")) {
-        std::string word = input->GetString("failure-detection");
+    if (input->HasParameter(kFailureDetection)) {
+        std::string word = input->GetString(kFailureDetection);
         LinkCriteriaSelectionPolicy criteria;
         // SetBeacon's argument has the opposite sense of its name.
         if (word == "link") {
@@ -119,20 +115,20 @@ void SetFailoverPolicy(boost::shared_ptr<Input> input, boost::shared_ptr<Output>
         policy.SetLinkCriteria(criteria);
     }
 
-    if (input->HasParameter("notify-switches")) {
-        policy.SetNotifySwitchOnFailure(input->GetBool("notify-switches"));
+    if (input->HasParameter(kNotifySwitches)) {
+        policy.SetNotifySwitchOnFailure(input->GetBool(kNotifySwitches));
     }
-    if (input->HasParameter("failback")) {
-        policy.SetRollingRestoration(!input->GetBool("failback"));
+    if (input->HasParameter(kFailback)) {
+        policy.SetRollingRestoration(!input->GetBool(kFailback));
     }
 
-    bool activeGiven = input->HasParameter("active-uplinks");
-    bool standbyGiven = input->HasParameter("standby-uplinks");
+    bool activeGiven = input->HasParameter(kActiveUplinks);
+    bool standbyGiven = input->HasParameter(kStandbyUplinks);
     std::vector<std::string> ordered;
 
     if (activeGiven) {
-        AppendUsableUplinks(input->GetString("active-uplinks"), "Unknown NIC name in active uplinks : ",
-                            connected, *output, ordered);
+        AppendUsableUplinks(input->GetString(kActiveUplinks), "Unknown NIC name in active uplinks : ", connected,
+                            *output, ordered);
         int activeCount = static_cast<int>(ordered.size());
         if (!standbyGiven) AppendPresentStandby(reference, ordered);
         policy.SetMaxActiveUplinks(activeCount);
@@ -140,8 +136,8 @@ void SetFailoverPolicy(boost::shared_ptr<Input> input, boost::shared_ptr<Output>
     }
 
     if (standbyGiven) {
-        AppendUsableUplinks(input->GetString("standby-uplinks"), "Unknown NIC name in standby uplinks : ",
-                            connected, *output, ordered);
+        AppendUsableUplinks(input->GetString(kStandbyUplinks), "Unknown NIC name in standby uplinks : ", connected,
+                            *output, ordered);
         if (!activeGiven) PrependPresentActive(reference, policy, ordered);
     }
 
@@ -155,45 +151,43 @@ void SetFailoverPolicy(boost::shared_ptr<Input> input, boost::shared_ptr<Output>
 
 void SetSecurityPolicy(boost::shared_ptr<Input> input, boost::shared_ptr<Output> /*output*/,
                        PortSecurityPolicy& policy) {
-    if (input->HasParameter("allow-promiscuous")) {
-        policy.SetAllowPromiscuous(input->GetBool("allow-promiscuous"));
+    if (input->HasParameter(kAllowPromiscuous)) {
+        policy.SetAllowPromiscuous(input->GetBool(kAllowPromiscuous));
     }
-    if (input->HasParameter("allow-mac-change")) {
-        policy.SetAllowMacAddressChange(input->GetBool("allow-mac-change"));
+    if (input->HasParameter(kAllowMacChange)) {
+        policy.SetAllowMacAddressChange(input->GetBool(kAllowMacChange));
     }
-    if (input->HasParameter("allow-forged-transmits")) {
-        policy.SetAllowForgedTransmits(input->GetBool("allow-forged-transmits"));
+    if (input->HasParameter(kAllowForgedTransmits)) {
+        policy.SetAllowForgedTransmits(input->GetBool(kAllowForgedTransmits));
     }
 }
 
-void SetShapingPolicy(boost::shared_ptr<Input> input, boost::shared_ptr<Output> output,
-                      ShapingPolicy& policy, bool requireAll) {
+void SetShapingPolicy(boost::shared_ptr<Input> input, boost::shared_ptr<Output> output, ShapingPolicy& policy,
+                      bool requireAll) {
     bool enabledNow = false;
-    if (input->HasParameter("enabled")) {
-        enabledNow = input->GetBool("enabled");
+    if (input->HasParameter(kShapingEnabled)) {
+        enabledNow = input->GetBool(kShapingEnabled);
         policy.SetEnabled(enabledNow);
     }
     if (!policy.enabled) return;
 
     // The values are positive 64-bit numbers; the unit conversions wrap in
     // unsigned 64-bit arithmetic rather than overflow.
-    auto given = [&input](char const* name) {
-        return static_cast<std::uint64_t>(input->GetLongLong(name));
-    };
+    auto given = [&input](Parameter const& number) { return static_cast<std::uint64_t>(input->GetLongLong(number)); };
     bool reportMissing = requireAll || enabledNow;
 
-    if (input->HasParameter("avg-bandwidth")) {
-        policy.SetAverageBps(given("avg-bandwidth") * 1000);
+    if (input->HasParameter(kAvgBandwidth)) {
+        policy.SetAverageBps(given(kAvgBandwidth) * 1000);
     } else if (reportMissing) {
         output->SetError("Missing required parameter --avg-bandwidth");
     }
-    if (input->HasParameter("peak-bandwidth")) {
-        policy.SetPeakBps(given("peak-bandwidth") * 1000);
+    if (input->HasParameter(kPeakBandwidth)) {
+        policy.SetPeakBps(given(kPeakBandwidth) * 1000);
     } else if (reportMissing) {
         output->SetError("Missing required parameter --peak-bandwidth");
     }
-    if (input->HasParameter("burst-size")) {
-        policy.SetBurstSize(given("burst-size") << 7);
+    if (input->HasParameter(kBurstSize)) {
+        policy.SetBurstSize(given(kBurstSize) << 7);
     } else if (reportMissing) {
         output->SetError("Missing required parameter --burst-size");
     }

@@ -1,15 +1,13 @@
 #pragma once
 
+#include <boost/shared_ptr.hpp>
 #include <string>
 #include <vector>
 
-#include <boost/shared_ptr.hpp>
-
+#include "CommandSupport.h"
 #include "gantry/network/NicTeamingPolicy.h"
 #include "gantry/network/PortSecurityPolicy.h"
 #include "gantry/network/ShapingPolicy.h"
-#include "plinth/callspec/Input.h"
-#include "plinth/callspec/Output.h"
 
 namespace KorvexCli {
 namespace NetworkNamespace {
@@ -26,23 +24,19 @@ namespace NetworkNamespace {
 // only one of the two lists is given, the other part of the present order
 // survives. The uplink order keeps the order the user typed.
 // IsValidPnic reads the host; an exception from it passes out.
-void SetFailoverPolicy(boost::shared_ptr<Plinth::CallSpec::Input> input,
-                       boost::shared_ptr<Plinth::CallSpec::Output> output,
-                       Gantry::Network::NicTeamingPolicy& policy,
-                       Gantry::Network::NicTeamingPolicy& reference,
+void SetFailoverPolicy(boost::shared_ptr<Input> input, boost::shared_ptr<Output> output,
+                       Gantry::Network::NicTeamingPolicy& policy, Gantry::Network::NicTeamingPolicy& reference,
                        std::vector<std::string> const& connected);
 
 // Sets each security option that was given. Reports nothing.
-void SetSecurityPolicy(boost::shared_ptr<Plinth::CallSpec::Input> input,
-                       boost::shared_ptr<Plinth::CallSpec::Output> output,
+void SetSecurityPolicy(boost::shared_ptr<Input> input, boost::shared_ptr<Output> output,
                        Gantry::Network::PortSecurityPolicy& policy);
 
 // Sets enabled if given; on a policy that is then enabled, stores the given
 // bandwidths (Kbps, times 1000) and burst size (Kib, times 128). A missing
 // value is reported when requireAll is true or this call itself enabled
 // shaping; on a disabled policy the values are dropped without a word.
-void SetShapingPolicy(boost::shared_ptr<Plinth::CallSpec::Input> input,
-                      boost::shared_ptr<Plinth::CallSpec::Output> output,
+void SetShapingPolicy(boost::shared_ptr<Input> input, boost::shared_ptr<Output> output,
                       Gantry::Network::ShapingPolicy& policy, bool requireAll);
 
 }  // namespace NetworkNamespace

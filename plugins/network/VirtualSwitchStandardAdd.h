@@ -1,24 +1,13 @@
 #pragma once
 
-#include <boost/shared_ptr.hpp>
-
-#include "plinth/autocli/Command.h"
+#include "plinth/autocli/CommandClass.h"
 
 namespace KorvexCli {
 namespace NetworkNamespace {
 
+// network vswitch standard add
 class VirtualSwitchStandardAdd : public virtual Plinth::AutoCli::Command {
-public:
-    static boost::shared_ptr<VirtualSwitchStandardAdd> New();
-    ~VirtualSwitchStandardAdd() override;
-
-    boost::shared_ptr<Plinth::CallSpec::InputSpec> GetInputSpecInternal() override;
-    boost::shared_ptr<Plinth::CallSpec::OutputSpec> GetOutputSpecInternal() override;
-    void ExecuteInternal(boost::shared_ptr<Plinth::CallSpec::Input> input,
-                         boost::shared_ptr<Plinth::CallSpec::Output> output) override;
-
-private:
-    VirtualSwitchStandardAdd();
+    PLINTH_COMMAND_CLASS(VirtualSwitchStandardAdd)
 };
 
 }  // namespace NetworkNamespace

@@ -1,26 +1,14 @@
 #pragma once
 
-#include <boost/shared_ptr.hpp>
-
-#include "plinth/autocli/Command.h"
-#include "plinth/metaobj/MetaStruct.h"
+#include "plinth/autocli/CommandClass.h"
 
 namespace KorvexCli {
 namespace NetworkNamespace {
 
+// network vswitch standard list
 class VirtualSwitchStandardList : public virtual Plinth::AutoCli::Command {
-public:
-    static boost::shared_ptr<VirtualSwitchStandardList> New();
-    ~VirtualSwitchStandardList() override;
-
-    boost::shared_ptr<Plinth::CallSpec::InputSpec> GetInputSpecInternal() override;
-    boost::shared_ptr<Plinth::CallSpec::OutputSpec> GetOutputSpecInternal() override;
+    PLINTH_COMMAND_CLASS(VirtualSwitchStandardList)
     boost::shared_ptr<Plinth::MetaObj::MetaStruct> GetOutputStructure();
-    void ExecuteInternal(boost::shared_ptr<Plinth::CallSpec::Input> input,
-                         boost::shared_ptr<Plinth::CallSpec::Output> output) override;
-
-private:
-    VirtualSwitchStandardList();
 };
 
 }  // namespace NetworkNamespace

@@ -1,17 +1,19 @@
 #include "VirtualSwitchStandardUplinkRemove.h"
 
-#include "gantry/lib/GantryException.h"
-#include "gantry/network/NetworkFactory.h"
-#include "gantry/network/VirtualSwitch.h"
-#include "plinth/callspec/Input.h"
-#include "plinth/callspec/InputSpec.h"
-#include "plinth/callspec/Output.h"
-#include "plinth/callspec/OutputSpec.h"
-#include "plinth/callspec/ParameterSpec.h"
-#include "plinth/metaobj/MetaBool.h"
+#include "CommandSupport.h"
+#include "VirtualSwitchChange.h"
 
 namespace KorvexCli {
 namespace NetworkNamespace {
+
+namespace {
+
+const Parameter kVswitchName =
+    Parameter::String("vswitch-name", "v", "The name of the virtual switch to remove an uplink from.").Required();
+const Parameter kUplinkName =
+    Parameter::String("uplink-name", "u", "The name of the uplink to remove from the virtual switch.").Required();
+
+}  // namespace
 
 VirtualSwitchStandardUplinkRemove::VirtualSwitchStandardUplinkRemove() {
     SetDescription(
@@ -21,53 +23,17 @@ VirtualSwitchStandardUplinkRemove::VirtualSwitchStandardUplinkRemove() {
     SetMetaDataField("type", "operation");
 }
 
-VirtualSwitchStandardUplinkRemove::~VirtualSwitchStandardUplinkRemove() {}
-
-boost::shared_ptr<VirtualSwitchStandardUplinkRemove> VirtualSwitchStandardUplinkRemove::New() {
-    return boost::shared_ptr<VirtualSwitchStandardUplinkRemove>(new VirtualSwitchStandardUplinkRemove());
+boost::shared_ptr<InputSpec> VirtualSwitchStandardUplinkRemove::GetInputSpecInternal() {
+    return InputSpecOf(kVswitchName, kUplinkName);
 }
 
-boost::shared_ptr<Plinth::CallSpec::InputSpec> VirtualSwitchStandardUplinkRemove::GetInputSpecInternal() {
-    boost::shared_ptr<Plinth::CallSpec::InputSpec> inputSpec = Plinth::CallSpec::InputSpec::New();
-
-    boost::shared_ptr<Plinth::CallSpec::ParameterSpec> vswitchName =
-        Plinth::CallSpec::ParameterSpec::New("vswitch-name", Plinth::CallSpec::PARAMETER_STRING);
-    vswitchName->SetRequired(true);
-    vswitchName->SetShortName("v");
-    vswitchName->SetDescription("The name of the virtual switch to remove an uplink from.");
-    inputSpec->AddParameter(vswitchName);
-
-    boost::shared_ptr<Plinth::CallSpec::ParameterSpec> uplinkName =
-        Plinth::CallSpec::ParameterSpec::New("uplink-name", Plinth::CallSpec::PARAMETER_STRING);
-    uplinkName->SetRequired(true);
-    uplinkName->SetShortName("u");
-    uplinkName->SetDescription("The name of the uplink to remove from the virtual switch.");
-    inputSpec->AddParameter(uplinkName);
-
-    return inputSpec;
+boost::shared_ptr<OutputSpec> VirtualSwitchStandardUplinkRemove::GetOutputSpecInternal() {
+    return OutputSpec::Of(MetaBool::New());
 }
 
-boost::shared_ptr<Plinth::CallSpec::OutputSpec> VirtualSwitchStandardUplinkRemove::GetOutputSpecInternal() {
-    boost::shared_ptr<Plinth::CallSpec::OutputSpec> outputSpec = Plinth::CallSpec::OutputSpec::New();
-    outputSpec->SetResultType(Plinth::MetaObj::MetaBool::New());
-    return outputSpec;
-}
-
-void VirtualSwitchStandardUplinkRemove::ExecuteInternal(boost::shared_ptr<Plinth::CallSpec::Input> input,
-                                                        boost::shared_ptr<Plinth::CallSpec::Output> output) {
-    Gantry::Network::VirtualSwitch* vswitch = nullptr;
-    try {
-        std::string vswitchName = input->GetString("vswitch-name");
-        std::string uplinkName = input->GetString("uplink-name");
-        vswitch = Gantry::Network::NetworkFactory::GetVirtualSwitchById(vswitchName);
-        vswitch->RemoveUplink(uplinkName);
-        output->SetResult(Plinth::MetaObj::MetaBool::New(true));
-        output->Finish();
-        delete vswitch;
-    } catch (Gantry::Lib::GantryException& e) {
-        delete vswitch;
-        output->SetError(e.GetMessage(0));
-    }
+void VirtualSwitchStandardUplinkRemove::ExecuteInternal(boost::shared_ptr<Input> input,
+                                                        boost::shared_ptr<Output> output) {
+    ChangeVirtualSwitch(input, output, kVswitchName, kUplinkName, &Gantry::Network::VirtualSwitch::RemoveUplink);
 }
 
 }  // namespace NetworkNamespace

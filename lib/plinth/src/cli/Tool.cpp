@@ -63,8 +63,8 @@ int Tool::RunWords(std::vector<std::string> const& words, std::ostream& out, std
         return EXIT_REFUSED;
     }
     if (!options.formatter.empty() && !MakeFormatter(options.formatter)) {
-        err << "Error: Unknown formatter '" << VisibleText(options.formatter) << "'. Available formatters: " << AvailableFormatters()
-            << ".\n";
+        err << "Error: Unknown formatter '" << VisibleText(options.formatter)
+            << "'. Available formatters: " << AvailableFormatters() << ".\n";
         return EXIT_REFUSED;
     }
 
@@ -77,8 +77,8 @@ int Tool::RunWords(std::vector<std::string> const& words, std::ostream& out, std
     if (!command) {
         if (!rest.empty() && rest.front() != "--help") {
             std::string const where = node->GetPathString(' ');
-            err << "Error: Unknown command or namespace " << (where.empty() ? "" : where + " ") << VisibleText(rest.front())
-                << ".\n\n"
+            err << "Error: Unknown command or namespace " << (where.empty() ? "" : where + " ")
+                << VisibleText(rest.front()) << ".\n\n"
                 << help_.NamespaceHelp(*node);
             return EXIT_REFUSED;
         }

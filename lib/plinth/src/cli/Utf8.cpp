@@ -51,9 +51,7 @@ bool IsValidUtf8(std::string const& text) {
     return true;
 }
 
-bool IsControl(char32_t codePoint) {
-    return codePoint < 0x20 || (codePoint >= 0x7F && codePoint <= 0x9F);
-}
+bool IsControl(char32_t codePoint) { return codePoint < 0x20 || (codePoint >= 0x7F && codePoint <= 0x9F); }
 
 std::string TextProblem(std::string const& text) {
     std::size_t position = 0;

@@ -1,10 +1,9 @@
 #pragma once
 
+#include <boost/shared_ptr.hpp>
 #include <string>
 #include <utility>
 #include <vector>
-
-#include <boost/shared_ptr.hpp>
 
 #include "plinth/callspec/InputSpec.h"
 #include "plinth/callspec/ParameterConstraint.h"
