@@ -123,6 +123,21 @@ expect_stderr_first_line "Error: Invalid value for option --vlan-id: 4096 is not
 cli network vswitch standard set -v switch1 -c up
 expect_status 2
 
+check "an integer that does not fit the command's int and a text that is not clean UTF-8 are refused, not passed on"
+before=$("$HALDENSIM" export)
+cli network vswitch standard set -v switch1 -m 4294968796
+expect_status 2
+expect_stderr_first_line "Error: Invalid value for option --mtu: '4294968796' is outside the 32-bit integer range (-2147483648 to 2147483647)."
+cli network vswitch standard set -v switch1 -m 2147483648
+expect_status 2
+cli network vswitch standard portgroup add -p $'bad\xff' -v switch1
+expect_status 2
+expect_stderr_first_line "Error: Invalid value for option --portgroup-name: 'bad\\xFF' is not valid UTF-8."
+cli network vswitch standard portgroup add -p $'two\nlines' -v switch1
+expect_status 2
+expect_stderr_first_line "Error: Invalid value for option --portgroup-name: 'two\\x0Alines' contains a control character."
+[ "$("$HALDENSIM" export)" == "$before" ] || fail_check "the host changed"
+
 check "an armed fault reaches the command's handler"
 sim fault add --operation "VirtualSwitch::AddPortGroup" --message "port group table full" --times 1
 cli network vswitch standard portgroup add -p Backup -v switch1

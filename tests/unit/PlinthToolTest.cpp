@@ -119,3 +119,23 @@ TEST(PlinthPluginLoader, TheEnvironmentListReplacesTheDirectory) {
     EXPECT_EQ((std::vector<std::string>{dir + "/liba.so", dir + "/libz.so"}), Plinth::Cli::PluginFiles(dir));
     EXPECT_TRUE(Plinth::Cli::PluginFiles(dir + "/missing").empty());
 }
+
+TEST_F(PlinthTool, AnExceptionThatEscapesACommandIsOneLineAndStatusOne) {
+    // Texts the command reported before it threw still go out, first.
+    command_->body = [](Input&, Output& output) {
+        output.SetError("Partly done");
+        throw std::out_of_range("vector::at: bad index\nsecond line");
+    };
+    EXPECT_EQ(1, Run({"network", "ruleset", "get", "-r", "dns"}));
+    EXPECT_EQ("Partly done\nvector::at: bad index\\x0Asecond line\n", err_.str());
+    EXPECT_EQ("", out_.str());
+
+    command_->body = [](Input&, Output&) { throw 42; };
+    EXPECT_EQ(1, Run({"network", "ruleset", "get", "-r", "dns"}));
+    EXPECT_EQ("The command failed with an unknown exception.\n", err_.str());
+
+    // The tool's own failures outside a command end the same way.
+    command_->inputSpec = []() -> boost::shared_ptr<InputSpec> { throw std::bad_alloc(); };
+    EXPECT_EQ(1, Run({"--help", "network", "ruleset", "get"}));
+    EXPECT_EQ("std::bad_alloc\n", err_.str());
+}
