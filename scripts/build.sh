@@ -3,16 +3,31 @@
 # first when they are missing. Incremental: when nothing changed since the
 # last successful build of the same scope, it returns at once.
 #
-#   scripts/build.sh tools   haldencli, haldensim and the network plug-in
-#   scripts/build.sh all     everything, tests included
+#   scripts/build.sh tools            haldencli, haldensim and the network plug-in
+#   scripts/build.sh all              everything, tests included
+#   scripts/build.sh all sanitized    everything, built with AddressSanitizer and
+#                                     UndefinedBehaviorSanitizer, in ./build-sanitized
 #
 # All of its own output goes to standard error, so that the wrappers can run
 # it in front of a command whose standard output scripts read.
 set -euo pipefail
 
 scope=${1:-all}
+variant=${2:-}
 top=$(cd "$(dirname "${BASH_SOURCE[0]}")/.." && pwd)
 build="$top/build"
+cmake_flags=(-DCMAKE_BUILD_TYPE=RelWithDebInfo)
+case "$variant" in
+  "") ;;
+  sanitized)
+    build="$top/build-sanitized"
+    sanitizers="-fsanitize=address,undefined -fno-sanitize-recover=all -fno-omit-frame-pointer"
+    cmake_flags=(-DCMAKE_BUILD_TYPE=Debug "-DCMAKE_CXX_FLAGS=$sanitizers -O1"
+                 "-DCMAKE_EXE_LINKER_FLAGS=$sanitizers" "-DCMAKE_SHARED_LINKER_FLAGS=$sanitizers"
+                 "-DCMAKE_MODULE_LINKER_FLAGS=$sanitizers")
+    ;;
+  *) echo "build.sh: unknown variant '$variant'" >&2; exit 2 ;;
+esac
 stamp="$build/.built-$scope"
 
 sources_changed() {
@@ -47,7 +62,7 @@ if [ ${#missing[@]} -gt 0 ]; then
 fi
 
 if [ ! -f "$build/CMakeCache.txt" ]; then
-  cmake -S "$top" -B "$build" -G Ninja -DCMAKE_BUILD_TYPE=RelWithDebInfo >&2
+  cmake -S "$top" -B "$build" -G Ninja "${cmake_flags[@]}" >&2
 fi
 touch "$stamp.new"
 if [ "$scope" = tools ]; then
