@@ -53,17 +53,25 @@ TEST(FirewallSet, NeedsAParameterBeforeTheModuleIsLookedAt) {
     EXPECT_FALSE(run.HasResult());
 }
 
-TEST(FirewallSet, ARepeatedEnabledPassesButARepeatedDefaultActionFails) {
+TEST(FirewallSet, EnabledIsStoredAndMayRepeatButARepeatedDefaultActionFails) {
     TempHost host;
     CommandRun run = RunCommand<FirewallSet>({"-e", "true"});
     EXPECT_EQ(run.errors, Errors{});
     EXPECT_EQ(run.Json(), "true");
+    EXPECT_EQ(Firewall()["enabled"], true);
+    run = RunCommand<FirewallSet>({"--enabled", "false"});
+    EXPECT_EQ(run.errors, Errors{});
+    EXPECT_EQ(run.Json(), "true");
+    EXPECT_EQ(Firewall()["enabled"], false);
+    EXPECT_EQ(RunCommand<FirewallSet>({"-e", "true"}).Json(), "true");
+    EXPECT_EQ(Firewall()["enabled"], true);
     EXPECT_EQ(RunCommand<FirewallSet>({"-d", "false"}).errors, Errors{"Default action already DROP"});
 
     // A failure stops the call: the default action is not changed after it.
     ArmFault({"SystemInfoImpl::SetFirewallEnabled", "switch stuck", 0, {}});
     run = RunCommand<FirewallSet>({"-e", "false", "-d", "true"});
     EXPECT_EQ(run.errors, Errors{"switch stuck"});
+    EXPECT_EQ(Firewall()["enabled"], true);
     EXPECT_EQ(Firewall()["defaultAction"], "DROP");
 }
 

@@ -1,6 +1,7 @@
 // network vswitch standard portgroup list, add, remove and set: the VLAN id's
-// bounds and default, and the host's failures. The round trip and the
-// refusals with their texts are proven in tests/cli/vswitch.test.sh.
+// bounds and default, a removal through the wrong switch, and the host's
+// failures. The round trip and the other refusals with their texts are proven
+// in tests/cli/vswitch.test.sh.
 
 #include <string>
 #include <vector>
@@ -11,6 +12,7 @@
 #include "SwitchTestSupport.h"
 #include "TempHost.h"
 #include "VirtualSwitchPortGroupList.h"
+#include "VirtualSwitchPortGroupRemove.h"
 #include "VirtualSwitchPortGroupSet.h"
 #include "plinth/callspec/InputSpec.h"
 #include "plinth/callspec/ParameterSpec.h"
@@ -36,6 +38,16 @@ TEST(VirtualSwitchPortGroupSet, TheVlanIdTakesItsBoundsAndZeroWhenLeftOut) {
         VirtualSwitchPortGroupSet::New()->GetInputSpec()->GetParameters().at(1);
     EXPECT_EQ(vlanId->GetName(), "vlan-id");
     EXPECT_EQ(vlanId->GetDescription(), "The vlan id for this port group. This value is in the range (0 - 4095)");
+}
+
+TEST(VirtualSwitchPortGroupRemove, ASwitchThatDoesNotHoldTheGroupRefusesAndKeepsIt) {
+    TempHost host([](TempHost::Json& d) { d["standardSwitches"].push_back(SwitchEntry("switch1", 64)); });
+    const std::string before = Trellis::Host::ExportHost();
+    CommandRun run = RunCommand<VirtualSwitchPortGroupRemove>({"-p", "Host Management", "-v", "switch1"});
+    EXPECT_EQ(run.errors, Errors{"Unable to remove port group Host Management from virtual switch switch1: "
+                                 "the switch has no port group of that name"});
+    EXPECT_FALSE(run.HasResult());
+    EXPECT_TRUE(Trellis::Host::ExportHost() == before);
 }
 
 TEST(VirtualSwitchPortGroup, HostFailuresPassOutAndChangeNothing) {

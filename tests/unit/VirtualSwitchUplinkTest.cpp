@@ -1,6 +1,6 @@
 // network vswitch standard uplink add and remove: the teaming order left
-// alone, and the host's failures. The host's refusals with their texts are
-// proven in tests/cli/vswitch.test.sh.
+// alone, a NIC that another switch holds, and the host's failures. The other
+// refusals with their texts are proven in tests/cli/vswitch.test.sh.
 
 #include <string>
 #include <vector>
@@ -44,5 +44,15 @@ TEST(VirtualSwitchStandardUplink, HostFailuresPassOutAndChangeNothing) {
     ArmFault({"NetworkFactory::GetVirtualSwitchById", "no factory", 0, 1});
     EXPECT_EQ(RunCommand<VirtualSwitchStandardUplinkRemove>({"-v", "switch0", "-u", "pnet0"}).errors,
               Errors{"no factory"});
+    EXPECT_TRUE(Trellis::Host::ExportHost() == before);
+}
+
+TEST(VirtualSwitchStandardUplink, ANicThatIsAnUplinkOfAnotherSwitchIsRefused) {
+    TempHost host([](TempHost::Json& d) { d["standardSwitches"].push_back(SwitchEntry("switch1", 64)); });
+    const std::string before = Trellis::Host::ExportHost();
+    CommandRun run = RunCommand<VirtualSwitchStandardUplinkAdd>({"-v", "switch1", "-u", "pnet0"});
+    EXPECT_EQ(run.errors, Errors{"Unable to add uplink pnet0 to virtual switch switch1: "
+                                 "it is already an uplink of virtual switch switch0"});
+    EXPECT_FALSE(run.HasResult());
     EXPECT_TRUE(Trellis::Host::ExportHost() == before);
 }
