@@ -163,6 +163,19 @@ TEST(PlinthTableFormatter, AnEmptyListWithoutAShapeTakesTheOutputSpecifications)
               Render("table", bare, {{"fields:Ruleset", "Name,Enabled"}}, MetaList::New(3, RulesetShape())));
 }
 
+TEST(PlinthTableFormatter, AlignsByDisplayWidth) {
+    boost::shared_ptr<MetaList> list = MetaList::New(3, RulesetShape());
+    list->AddMetaStruct(Ruleset("東京", true, {"22"}));
+    list->AddMetaStruct(Ruleset("Cafe\u0301", true, {"53"}));  // a combining accent
+    list->AddMetaStruct(Ruleset("ｗｅｂ", true, {"80"}));
+    EXPECT_EQ("Name    Ports\n"
+              "------  -----\n"
+              "東京    22\n"
+              "Cafe\u0301    53\n"
+              "ｗｅｂ  80\n",
+              Render("table", list, {{"fields:Ruleset", "Name,Ports"}}));
+}
+
 TEST(PlinthCsvFormatter, HeaderRowAndQuotedCells) {
     boost::shared_ptr<MetaList> list = Rulesets();
     list->AddMetaStruct(Ruleset("say \"hi\", then\nleave", true, {}));

@@ -4,6 +4,7 @@
 
 #include "plinth/cli/Formatters.h"
 #include "plinth/cli/TableRows.h"
+#include "plinth/cli/Utf8.h"
 #include "plinth/cli/ValueText.h"
 #include "plinth/metaobj/MetaBool.h"
 #include "plinth/metaobj/MetaList.h"
@@ -19,7 +20,7 @@ void WriteRow(std::ostream& out, std::vector<std::string> const& cells, std::vec
     std::string line;
     for (size_t i = 0; i < cells.size(); ++i) {
         if (i > 0) line += "  ";
-        line += cells[i] + std::string(widths[i] - cells[i].size(), ' ');
+        line += cells[i] + std::string(widths[i] - DisplayWidth(cells[i]), ' ');
     }
     out << boost::algorithm::trim_right_copy(line) << "\n";
 }
@@ -39,9 +40,9 @@ void TableFormatter::Write(std::ostream& out, boost::shared_ptr<MetaObject> cons
         return;
     }
     std::vector<size_t> widths;
-    for (std::string const& title : table.columns) widths.push_back(title.size());
+    for (std::string const& title : table.columns) widths.push_back(DisplayWidth(title));
     for (auto const& row : table.rows) {
-        for (size_t i = 0; i < row.size(); ++i) widths[i] = std::max(widths[i], row[i].size());
+        for (size_t i = 0; i < row.size(); ++i) widths[i] = std::max(widths[i], DisplayWidth(row[i]));
     }
     std::vector<std::string> dashes;
     for (size_t width : widths) dashes.push_back(std::string(width, '-'));
