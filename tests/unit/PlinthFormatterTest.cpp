@@ -163,19 +163,6 @@ TEST(PlinthTableFormatter, AnEmptyListWithoutAShapeTakesTheOutputSpecifications)
               Render("table", bare, {{"fields:Ruleset", "Name,Enabled"}}, MetaList::New(3, RulesetShape())));
 }
 
-TEST(PlinthTableFormatter, AlignsByDisplayWidth) {
-    boost::shared_ptr<MetaList> list = MetaList::New(3, RulesetShape());
-    list->AddMetaStruct(Ruleset("東京", true, {"22"}));
-    list->AddMetaStruct(Ruleset("Cafe\u0301", true, {"53"}));  // a combining accent
-    list->AddMetaStruct(Ruleset("ｗｅｂ", true, {"80"}));
-    EXPECT_EQ("Name    Ports\n"
-              "------  -----\n"
-              "東京    22\n"
-              "Cafe\u0301    53\n"
-              "ｗｅｂ  80\n",
-              Render("table", list, {{"fields:Ruleset", "Name,Ports"}}));
-}
-
 TEST(PlinthCsvFormatter, HeaderRowAndQuotedCells) {
     boost::shared_ptr<MetaList> list = Rulesets();
     list->AddMetaStruct(Ruleset("say \"hi\", then\nleave", true, {}));
@@ -227,4 +214,30 @@ TEST(PlinthKeyValueFormatter, OneTypedLinePerValue) {
               "Ruleset.Timeout.integer=\n",
               Render("keyvalue", Ruleset("dns", true, {"53"})));
     EXPECT_EQ("boolean=false\n", Render("keyvalue", MetaBool::New(false)));
+}
+
+TEST(PlinthTableFormatter, AlignsByDisplayWidthAndKeepsEachRowOnOneLine) {
+    boost::shared_ptr<MetaList> list = MetaList::New(3, RulesetShape());
+    list->AddMetaStruct(Ruleset("東京", true, {"22"}));
+    list->AddMetaStruct(Ruleset("Cafe\u0301", true, {"53"}));  // a combining accent
+    list->AddMetaStruct(Ruleset("ｗｅｂ", true, {"80"}));
+    list->AddMetaStruct(Ruleset("two\nlines\\", true, {"1\r\n2"}));
+    EXPECT_EQ("Name          Ports\n"
+              "------------  ------\n"
+              "東京          22\n"
+              "Cafe\u0301          53\n"
+              "ｗｅｂ        80\n"
+              "two\\nlines\\\\  1\\r\\n2\n",
+              Render("table", list, {{"fields:Ruleset", "Name,Ports"}}));
+    EXPECT_EQ("one\\ntwo\n", Render("table", MetaString::New("one\ntwo")));
+}
+
+TEST(PlinthKeyValueFormatter, ValuesAndKeysStayOnOneLineEscapedReversibly) {
+    boost::shared_ptr<MetaStruct> note = MetaStruct::New("Note");
+    note->SetField("Text", "C:\\temp\\new\r\nline\ttab\x1b[0m \xC2\x85\xE2\x80\xA8 bad\xC3 caf\xC3\xA9 \xF0\x9F\x99\x82");
+    note->SetField("Title\nwith break", "x");
+    EXPECT_EQ("Note.Text.string=C:\\\\temp\\\\new\\r\\nline\\ttab\\u001b[0m \\u0085\\u2028 bad\uFFFD caf\xC3\xA9 "
+              "\xF0\x9F\x99\x82\n"
+              "Note.Title\\nwith break.string=x\n",
+              Render("keyvalue", note));
 }
