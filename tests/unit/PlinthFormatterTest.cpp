@@ -1,14 +1,17 @@
 // The formatters on the shapes commands deliver: a structure, a list of
-// structures, nested lists and structures, unset fields, booleans; and the
-// hints that choose fields, titles and units. The simple layout of nested
-// structures and an empty table with its shape are proven through the test
-// plug-in in tests/cli/frame.test.sh.
+// structures, nested lists and structures, unset fields, booleans; the hints
+// that choose fields, titles and units; and texts holding markup characters,
+// line breaks, controls, wide characters and bytes that are not UTF-8. An
+// empty table with its shape is proven through the test plug-in in
+// tests/cli/frame.test.sh.
 #include <gtest/gtest.h>
 
+#include <regex>
 #include <sstream>
 
 #include "plinth/Plinth.h"
 #include "plinth/cli/Formatter.h"
+#include "plinth/cli/Utf8.h"
 
 using namespace Plinth::MetaObj;
 using Plinth::Cli::FormatHints;
@@ -67,6 +70,58 @@ boost::shared_ptr<MetaStruct> Switch() {
     vswitch->SetField("Portgroups", groups);
     vswitch->SetField("Uplinks", std::vector<std::string>{"pnet0", "pnet1"});
     return vswitch;
+}
+
+bool XmlAllows(char32_t c) {
+    return c == 0x9 || c == 0xA || c == 0xD || (c >= 0x20 && c <= 0xD7FF) || (c >= 0xE000 && c <= 0xFFFD) ||
+           c >= 0x10000;
+}
+
+// Text between tags or inside an attribute value: no markup character except
+// references to the predefined entities and to characters XML allows.
+bool XmlTextIsWellFormed(std::string const& text) {
+    static std::regex const reference("&(amp|lt|gt|quot|apos|#x([0-9A-Fa-f]{1,6})|#([0-9]{1,7}));");
+    std::string rest = text;
+    for (std::smatch m; std::regex_search(rest, m, reference); rest = m.suffix()) {
+        if (m.prefix().str().find_first_of("&<") != std::string::npos) return false;
+        if (m[2].matched && !XmlAllows(std::stoul(m[2], nullptr, 16))) return false;
+        if (m[3].matched && !XmlAllows(std::stoul(m[3]))) return false;
+    }
+    return rest.find_first_of("&<") == std::string::npos;
+}
+
+// The first reason xml is not a well-formed document as the xml formatter
+// writes them (a declaration, then one root element), "" for none.
+std::string XmlProblem(std::string const& xml) {
+    std::size_t position = 0;
+    for (char32_t c = 0; position < xml.size();) {
+        if (!Plinth::Cli::NextCodePoint(xml, position, c)) return "not UTF-8 at byte " + std::to_string(position);
+        if (!XmlAllows(c)) return "a character XML forbids at byte " + std::to_string(position);
+    }
+    std::string const declaration = "<?xml version=\"1.0\" encoding=\"UTF-8\"?>";
+    if (xml.compare(0, declaration.size(), declaration) != 0) return "no declaration";
+    static std::regex const tag(R"(^<(/?)([A-Za-z_][\w.-]*)((?:\s+[A-Za-z_][\w.-]*="[^"<]*")*)\s*(/?)>)");
+    std::vector<std::string> open;
+    int roots = 0;
+    std::string rest = xml.substr(declaration.size());
+    for (std::smatch m; !rest.empty(); rest = m.suffix()) {
+        std::string const text = rest.substr(0, rest.find('<'));
+        if (open.empty() ? text.find_first_not_of(" \n") != std::string::npos : !XmlTextIsWellFormed(text)) {
+            return "bad text: " + text;
+        }
+        rest = rest.substr(text.size());
+        if (rest.empty()) break;
+        if (!std::regex_search(rest, m, tag)) return "bad tag: " + rest.substr(0, 40);
+        if (!XmlTextIsWellFormed(m[3])) return "bad attribute: " + m[3].str();
+        if (m[1].length() > 0) {
+            if (open.empty() || open.back() != m[2]) return "unbalanced </" + m[2].str() + ">";
+            open.pop_back();
+        } else {
+            if (open.empty() && ++roots > 1) return "a second root element";
+            if (m[4].length() == 0) open.push_back(m[2]);
+        }
+    }
+    return roots == 1 && open.empty() ? "" : "no root or an unclosed element";
 }
 
 }  // namespace
@@ -214,6 +269,50 @@ TEST(PlinthKeyValueFormatter, OneTypedLinePerValue) {
               "Ruleset.Timeout.integer=\n",
               Render("keyvalue", Ruleset("dns", true, {"53"})));
     EXPECT_EQ("boolean=false\n", Render("keyvalue", MetaBool::New(false)));
+}
+
+TEST(PlinthFormatters, QuotesMarkupLineBreaksAndWideCharactersInEveryFormat) {
+    boost::shared_ptr<MetaStruct> rule = MetaStruct::New("Rule");
+    rule->SetField("Name", "a \"q\" <b> & 東京\nx");
+    rule->SetField("Port", 22);
+    EXPECT_EQ("{\"Name\":\"a \\\"q\\\" <b> & 東京\\nx\",\"Port\":22}\n", Render("json", rule));
+    EXPECT_EQ("Name,Port\n\"a \"\"q\"\" <b> & 東京\nx\",22\n", Render("csv", rule));
+    EXPECT_EQ("Rule.Name.string=a \"q\" <b> & 東京\\nx\nRule.Port.integer=22\n", Render("keyvalue", rule));
+    EXPECT_EQ("Rule\n   Name: a \"q\" <b> & 東京\\nx\n   Port: 22\n", Render("simple", rule));
+    EXPECT_EQ("Name                 Port\n"
+              "-------------------  ----\n"
+              "a \"q\" <b> & 東京\\nx  22\n",
+              Render("table", rule));
+    std::string const xml = Render("xml", rule);
+    EXPECT_EQ("", XmlProblem(xml)) << xml;
+    EXPECT_NE(std::string::npos, xml.find("<string>a &quot;q&quot; &lt;b&gt; &amp; 東京&#xA;x</string>")) << xml;
+}
+
+TEST(PlinthXmlFormatter, ControlsAndInvalidBytesInNamesAndValuesStayWellFormed) {
+    boost::shared_ptr<MetaStruct> odd = MetaStruct::New("R&D \"lab\" <1>");
+    odd->SetField("Line\nbreak", "bell\x07 tab\t cr\r del\x7f bad\xff\xfe nonchar\xEF\xBF\xBF end");
+    odd->SetField("Tags", std::vector<std::string>{"\x01", "\xE6\x9D"});
+    std::string const xml = Render("xml", odd);
+    EXPECT_EQ("", XmlProblem(xml)) << xml;
+    EXPECT_EQ("<?xml version=\"1.0\" encoding=\"UTF-8\"?>\n"
+              "<output>\n"
+              "  <structure name=\"R&amp;D &quot;lab&quot; &lt;1&gt;\">\n"
+              "    <field name=\"Line&#xA;break\">\n"
+              "      <string>bell\uFFFD tab&#x9; cr&#xD; del&#x7F; bad\uFFFD\uFFFD nonchar\uFFFD end</string>\n"
+              "    </field>\n"
+              "    <field name=\"Tags\">\n"
+              "      <list>\n"
+              "        <string>\uFFFD</string>\n"
+              "        <string>\uFFFD\uFFFD</string>\n"
+              "      </list>\n"
+              "    </field>\n"
+              "  </structure>\n"
+              "</output>\n",
+              xml);
+    // The check itself tells ill-formed documents apart.
+    EXPECT_NE("", XmlProblem("<?xml version=\"1.0\" encoding=\"UTF-8\"?>\n<a>x & y</a>\n"));
+    EXPECT_NE("", XmlProblem("<?xml version=\"1.0\" encoding=\"UTF-8\"?>\n<a b=\"&#x1;\"/>\n"));
+    EXPECT_NE("", XmlProblem("<?xml version=\"1.0\" encoding=\"UTF-8\"?>\n<a><b></a></b>\n"));
 }
 
 TEST(PlinthTableFormatter, AlignsByDisplayWidthAndKeepsEachRowOnOneLine) {
