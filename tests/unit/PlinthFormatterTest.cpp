@@ -157,6 +157,23 @@ TEST(PlinthSimpleFormatter, StructureUnderItsNameWithUnsetFieldsEmpty) {
               Render("simple", Ruleset("dns", true, {"53", "5353"})));
 }
 
+TEST(PlinthSimpleFormatter, NestedStructuresIndentOneStepFurtherAndBlocksAreSeparatedByABlankLine) {
+    EXPECT_EQ("VirtualSwitch\n"
+              "   Name: switch0\n"
+              "   Policy:\n"
+              "      ShapingPolicy\n"
+              "         Enabled: true\n"
+              "         Average Bandwidth: 100\n"
+              "   Portgroups:\n"
+              "      PortGroup\n"
+              "         Name: Host Management\n"
+              "\n"
+              "      PortGroup\n"
+              "         Name: Guest Network\n"
+              "   Uplinks: pnet0, pnet1\n",
+              Render("simple", Switch()));
+}
+
 TEST(PlinthSimpleFormatter, ListOfStructuresAsBlocksWithFieldAndHeaderHints) {
     EXPECT_EQ("Ruleset sshServer (false)\n"
               "   Enabled: false\n"
