@@ -1,14 +1,17 @@
 // The formatters on the shapes commands deliver: a structure, a list of
-// structures, nested lists and structures, unset fields, booleans; and the
-// hints that choose fields, titles and units. The simple layout of nested
-// structures and an empty table with its shape are proven through the test
-// plug-in in tests/cli/frame.test.sh.
+// structures, nested lists and structures, unset fields, booleans; the hints
+// that choose fields, titles and units; and texts holding markup characters,
+// line breaks, controls, wide characters and bytes that are not UTF-8. An
+// empty table with its shape is proven through the test plug-in in
+// tests/cli/frame.test.sh.
 #include <gtest/gtest.h>
 
+#include <regex>
 #include <sstream>
 
 #include "plinth/Plinth.h"
 #include "plinth/cli/Formatter.h"
+#include "plinth/cli/Utf8.h"
 
 using namespace Plinth::MetaObj;
 using Plinth::Cli::FormatHints;
@@ -69,6 +72,42 @@ boost::shared_ptr<MetaStruct> Switch() {
     return vswitch;
 }
 
+// Element text or an attribute value: no markup except the references the
+// xml formatter writes.
+bool IsPlainXmlText(std::string const& text) {
+    static std::regex const reference("&(amp|lt|gt|quot|#x(9|A|D|[2-9A-F][0-9A-F]));");
+    return std::regex_replace(text, reference, "").find_first_of("<&") == std::string::npos;
+}
+
+// Why xml is not well-formed as the xml formatter writes it (a declaration,
+// then one root of elements with at most a name attribute); "" when it is.
+std::string XmlProblem(std::string const& xml) {
+    std::size_t at = 0;
+    for (char32_t c = 0; at < xml.size();) {
+        if (!Plinth::Cli::NextCodePoint(xml, at, c)) return "not UTF-8";
+        if (c < 0x20 ? c != '\t' && c != '\n' && c != '\r' : c == 0xFFFE || c == 0xFFFF) return "a forbidden character";
+    }
+    std::string const declaration = "<?xml version=\"1.0\" encoding=\"UTF-8\"?>\n";
+    if (xml.compare(0, declaration.size(), declaration) != 0) return "no declaration";
+    static std::regex const tag(R"re(<(/?)([a-z]+)(?: name="([^"]*)")?(/?)>)re");
+    std::vector<std::string> open;
+    int roots = 0;
+    std::string rest = xml.substr(declaration.size());
+    for (std::smatch m; std::regex_search(rest, m, tag); rest = m.suffix()) {
+        bool const outside = open.empty() && m.prefix().str().find_first_not_of("\n") != std::string::npos;
+        if (outside || !IsPlainXmlText(m.prefix()) || !IsPlainXmlText(m[3])) return "bad text before " + m.str();
+        if (m[1].length() > 0) {
+            if (open.empty() || open.back() != m[2]) return "unbalanced " + m.str();
+            open.pop_back();
+        } else if (open.empty() && roots++ > 0) {
+            return "a second root";
+        } else if (m[4].length() == 0) {
+            open.push_back(m[2]);
+        }
+    }
+    return open.empty() && roots == 1 && rest == "\n" ? "" : "an unclosed element";
+}
+
 }  // namespace
 
 TEST(PlinthJsonFormatter, KeysInDeclarationOrderUnsetAsNullOneLine) {
@@ -100,6 +139,23 @@ TEST(PlinthSimpleFormatter, StructureUnderItsNameWithUnsetFieldsEmpty) {
               "   Ports: 53, 5353\n"
               "   Timeout:\n",
               Render("simple", Ruleset("dns", true, {"53", "5353"})));
+}
+
+TEST(PlinthSimpleFormatter, NestedStructuresIndentOneStepFurtherAndBlocksAreSeparatedByABlankLine) {
+    EXPECT_EQ("VirtualSwitch\n"
+              "   Name: switch0\n"
+              "   Policy:\n"
+              "      ShapingPolicy\n"
+              "         Enabled: true\n"
+              "         Average Bandwidth: 100\n"
+              "   Portgroups:\n"
+              "      PortGroup\n"
+              "         Name: Host Management\n"
+              "\n"
+              "      PortGroup\n"
+              "         Name: Guest Network\n"
+              "   Uplinks: pnet0, pnet1\n",
+              Render("simple", Switch()));
 }
 
 TEST(PlinthSimpleFormatter, ListOfStructuresAsBlocksWithFieldAndHeaderHints) {
@@ -214,4 +270,51 @@ TEST(PlinthKeyValueFormatter, OneTypedLinePerValue) {
               "Ruleset.Timeout.integer=\n",
               Render("keyvalue", Ruleset("dns", true, {"53"})));
     EXPECT_EQ("boolean=false\n", Render("keyvalue", MetaBool::New(false)));
+}
+
+TEST(PlinthFormatters, MarkupLineBreaksControlsWideCharactersAndInvalidBytesInEveryFormat) {
+    boost::shared_ptr<MetaStruct> odd = MetaStruct::New("R&D \"lab\"");
+    odd->SetField("Name", "a \"q\" <b> & 東京\nx");
+    odd->SetField("Raw\nbytes", "C:\\x\t\r\x07\x7f\u2028\xE6\x9D");  // the last two bytes are not UTF-8
+    EXPECT_EQ("{\"Name\":\"a \\\"q\\\" <b> & 東京\\nx\",\"Raw\\nbytes\":\"C:\\\\x\\t\\r\\u0007\x7f\u2028\uFFFD\"}\n",
+              Render("json", odd));
+    EXPECT_EQ("Name,\"Raw\nbytes\"\n\"a \"\"q\"\" <b> & 東京\nx\",\"C:\\x\t\r\x07\x7f\u2028\uFFFD\uFFFD\"\n",
+              Render("csv", odd));
+    EXPECT_EQ("R&D \"lab\".Name.string=a \"q\" <b> & 東京\\nx\n"
+              "R&D \"lab\".Raw\\nbytes.string=C:\\\\x\\t\\r\\u0007\\u007f\\u2028\uFFFD\uFFFD\n",
+              Render("keyvalue", odd));
+    EXPECT_EQ("R&D \"lab\"\n"
+              "   Name: a \"q\" <b> & 東京\\nx\n"
+              "   Raw\\nbytes: C:\\\\x\\t\\r\\u0007\\u007f\\u2028\uFFFD\uFFFD\n",
+              Render("simple", odd));
+    EXPECT_EQ("Name                 Raw\\nbytes\n"
+              "-------------------  -----------------------------\n"
+              "a \"q\" <b> & 東京\\nx  C:\\\\x\\t\\r\\u0007\\u007f\\u2028\uFFFD\uFFFD\n",
+              Render("table", odd));
+    std::string const xml = Render("xml", odd);
+    EXPECT_EQ("", XmlProblem(xml)) << xml;
+    EXPECT_EQ("<?xml version=\"1.0\" encoding=\"UTF-8\"?>\n"
+              "<output>\n"
+              "  <structure name=\"R&amp;D &quot;lab&quot;\">\n"
+              "    <field name=\"Name\">\n"
+              "      <string>a &quot;q&quot; &lt;b&gt; &amp; 東京&#xA;x</string>\n"
+              "    </field>\n"
+              "    <field name=\"Raw&#xA;bytes\">\n"
+              "      <string>C:\\x&#x9;&#xD;\uFFFD&#x7F;\u2028\uFFFD\uFFFD</string>\n"
+              "    </field>\n"
+              "  </structure>\n"
+              "</output>\n",
+              xml);
+}
+
+TEST(PlinthTableFormatter, AlignsByDisplayWidthAndEscapesLineBreaks) {
+    boost::shared_ptr<MetaList> list = MetaList::New(3, RulesetShape());
+    list->AddMetaStruct(Ruleset("東京", true, {"22"}));
+    list->AddMetaStruct(Ruleset("Cafe\u0301", true, {"53"}));  // a combining accent
+    EXPECT_EQ("Name  Ports\n"
+              "----  -----\n"
+              "東京  22\n"
+              "Cafe\u0301  53\n",
+              Render("table", list, {{"fields:Ruleset", "Name,Ports"}}));
+    EXPECT_EQ("one\\ntwo\n", Render("table", MetaString::New("one\ntwo")));
 }

@@ -97,3 +97,11 @@ TEST(PlinthTextLayout, WrapsAtBlanksAndKeepsLongWordsWhole) {
     EXPECT_EQ((std::vector<std::string>{"listed  by name"}), Plinth::Cli::WrapText("listed  by name", 40));
     EXPECT_EQ((std::vector<std::string>{"listed", "by name"}), Plinth::Cli::WrapText("listed  by name", 8));
 }
+
+TEST(PlinthTextLayout, MeasuresDisplayColumnsNotBytes) {
+    // An ideograph takes two columns and three bytes; "ß" one column and two bytes.
+    EXPECT_EQ((std::vector<std::string>{"東京 大阪", "京都"}), Plinth::Cli::WrapText("東京 大阪 京都", 9));
+    EXPECT_EQ("  名前    The name\n  Straße  The street\n",
+              Plinth::Cli::FormatColumns("名前", "The name", 2, 10, 80) +
+                  Plinth::Cli::FormatColumns("Straße", "The street", 2, 10, 80));
+}

@@ -1,5 +1,6 @@
 #include "plinth/cli/Formatters.h"
 #include "plinth/cli/TableRows.h"
+#include "plinth/cli/Utf8.h"
 #include "plinth/cli/ValueText.h"
 
 namespace Plinth {
@@ -10,9 +11,10 @@ using namespace MetaObj;
 namespace {
 
 std::string Quote(std::string const& cell) {
-    if (cell.find_first_of(",\"\r\n") == std::string::npos) return cell;
+    std::string const text = ReplaceInvalidUtf8(cell);
+    if (text.find_first_of(",\"\r\n") == std::string::npos) return text;
     std::string quoted = "\"";
-    for (char c : cell) {
+    for (char c : text) {
         if (c == '"') quoted += '"';
         quoted += c;
     }

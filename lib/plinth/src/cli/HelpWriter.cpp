@@ -6,6 +6,7 @@
 
 #include "plinth/cli/Formatter.h"
 #include "plinth/cli/TextLayout.h"
+#include "plinth/cli/Utf8.h"
 
 namespace Plinth {
 namespace Cli {
@@ -45,7 +46,7 @@ std::string FullEnumValues(ParameterConstraint const* constraint) {
 
 std::string ListChildren(std::vector<boost::shared_ptr<NamespaceNode> > const& nodes) {
     size_t widest = 0;
-    for (auto const& node : nodes) widest = std::max(widest, node->GetName().size());
+    for (auto const& node : nodes) widest = std::max(widest, DisplayWidth(node->GetName()));
     std::string text;
     for (auto const& node : nodes) {
         text += FormatColumns(node->GetName(), node->GetDescription(), 2, 2 + widest + 2, kWidth);

@@ -25,7 +25,7 @@ public:
     // key is the path so far ("" at the top level).
     void Value(std::string const& key, boost::shared_ptr<MetaObject> const& value) {
         if (!value) {
-            out_ << key << "=\n";
+            out_ << OneLineText(key) << "=\n";
         } else if (value->GetMetaType() == META_STRUCT) {
             MetaStruct const& structure = static_cast<MetaStruct const&>(*value);
             std::string const prefix = key.empty() ? structure.GetName() : key;
@@ -36,7 +36,8 @@ public:
             }
         } else {
             std::string const type = TypeName(value->GetMetaType());
-            out_ << (key.empty() ? type : key + "." + type) << "=" << InlineText(value, hints_) << "\n";
+            out_ << OneLineText(key.empty() ? type : key + "." + type) << "="
+                 << OneLineText(InlineText(value, hints_)) << "\n";
         }
     }
 

@@ -19,8 +19,10 @@ class SimpleWriter {
 public:
     SimpleWriter(std::ostream& out, FormatHints const& hints) : out_(out), hints_(hints) {}
 
+    // Escaped, so that a value holding a line break cannot start what looks
+    // like the next field.
     void Line(int indent, std::string const& text) {
-        out_ << boost::algorithm::trim_right_copy(std::string(indent, ' ') + text) << "\n";
+        out_ << boost::algorithm::trim_right_copy(std::string(indent, ' ') + OneLineText(text)) << "\n";
     }
 
     // A structure's title line at indent, its fields three spaces further.

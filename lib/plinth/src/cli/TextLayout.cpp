@@ -2,6 +2,8 @@
 
 #include <sstream>
 
+#include "plinth/cli/Utf8.h"
+
 namespace Plinth {
 namespace Cli {
 
@@ -15,6 +17,7 @@ void WrapLine(std::string const& line, size_t width, std::vector<std::string>& l
     }
     std::string const prefix(indent, ' ');
     std::string current = prefix;
+    size_t currentWidth = indent;
     size_t position = indent;
     while (position < line.size()) {
         // The blanks before a word are kept as written within a line.
@@ -24,12 +27,15 @@ void WrapLine(std::string const& line, size_t width, std::vector<std::string>& l
         if (wordEnd == std::string::npos) wordEnd = line.size();
         std::string const gap = line.substr(position, wordStart - position);
         std::string const word = line.substr(wordStart, wordEnd - wordStart);
+        size_t const wordWidth = DisplayWidth(word);
         bool const empty = current.size() == prefix.size();
-        if (!empty && current.size() + gap.size() + word.size() > width) {
+        if (!empty && currentWidth + gap.size() + wordWidth > width) {
             lines.push_back(current);
             current = prefix + word;
+            currentWidth = indent + wordWidth;
         } else {
             current += (empty ? "" : gap) + word;
+            currentWidth += (empty ? 0 : gap.size()) + wordWidth;
         }
         position = wordEnd;
     }
@@ -56,8 +62,9 @@ std::string FormatColumns(std::string const& left, std::string const& right, siz
     while (!lines.empty() && lines.front().empty()) lines.erase(lines.begin());
     if (lines.empty()) return text + "\n";
     size_t first = 0;
-    if (text.size() + 1 <= column && !lines.empty()) {
-        text += std::string(column - text.size(), ' ') + lines[0];
+    size_t const textWidth = DisplayWidth(text);
+    if (textWidth + 1 <= column && !lines.empty()) {
+        text += std::string(column - textWidth, ' ') + lines[0];
         first = 1;
     }
     text += "\n";

@@ -42,6 +42,43 @@ bool NextCodePoint(std::string const& text, std::size_t& position, char32_t& cod
     return true;
 }
 
+bool NextCodePointOrReplacement(std::string const& text, std::size_t& position, char32_t& codePoint) {
+    if (position >= text.size()) return false;
+    if (!NextCodePoint(text, position, codePoint)) {
+        codePoint = kReplacementCharacter;
+        ++position;
+    }
+    return true;
+}
+
+void AppendUtf8(std::string& text, char32_t codePoint) {
+    auto append = [&text](unsigned value) { text += static_cast<char>(value); };
+    if (codePoint < 0x80) {
+        append(codePoint);
+    } else if (codePoint < 0x800) {
+        append(0xC0 | (codePoint >> 6));
+        append(0x80 | (codePoint & 0x3F));
+    } else if (codePoint < 0x10000) {
+        append(0xE0 | (codePoint >> 12));
+        append(0x80 | ((codePoint >> 6) & 0x3F));
+        append(0x80 | (codePoint & 0x3F));
+    } else {
+        append(0xF0 | (codePoint >> 18));
+        append(0x80 | ((codePoint >> 12) & 0x3F));
+        append(0x80 | ((codePoint >> 6) & 0x3F));
+        append(0x80 | (codePoint & 0x3F));
+    }
+}
+
+std::string ReplaceInvalidUtf8(std::string const& text) {
+    if (IsValidUtf8(text)) return text;
+    std::string replaced;
+    std::size_t position = 0;
+    char32_t codePoint = 0;
+    while (NextCodePointOrReplacement(text, position, codePoint)) AppendUtf8(replaced, codePoint);
+    return replaced;
+}
+
 bool IsValidUtf8(std::string const& text) {
     std::size_t position = 0;
     char32_t codePoint = 0;

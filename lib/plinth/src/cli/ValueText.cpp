@@ -1,5 +1,9 @@
 #include "plinth/cli/ValueText.h"
 
+#include <cstdio>
+
+#include "plinth/cli/Utf8.h"
+
 #include "plinth/metaobj/MetaBool.h"
 #include "plinth/metaobj/MetaInt.h"
 #include "plinth/metaobj/MetaList.h"
@@ -44,6 +48,29 @@ std::string InlineText(boost::shared_ptr<MetaObject> const& value, FormatHints c
     }
     }
     return "";
+}
+
+std::string OneLineText(std::string const& text) {
+    std::string escaped;
+    std::size_t position = 0;
+    char32_t codePoint = 0;
+    while (NextCodePointOrReplacement(text, position, codePoint)) {
+        switch (codePoint) {
+        case '\\': escaped += "\\\\"; break;
+        case '\t': escaped += "\\t"; break;
+        case '\n': escaped += "\\n"; break;
+        case '\r': escaped += "\\r"; break;
+        default:
+            if (IsControl(codePoint) || codePoint == 0x2028 || codePoint == 0x2029) {
+                char hex[8];
+                std::snprintf(hex, sizeof hex, "\\u%04x", static_cast<unsigned>(codePoint));
+                escaped += hex;
+            } else {
+                AppendUtf8(escaped, codePoint);
+            }
+        }
+    }
+    return escaped;
 }
 
 bool IsStructList(boost::shared_ptr<MetaObject> const& value) {

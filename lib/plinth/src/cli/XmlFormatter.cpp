@@ -1,4 +1,7 @@
+#include <cstdio>
+
 #include "plinth/cli/Formatters.h"
+#include "plinth/cli/Utf8.h"
 #include "plinth/cli/ValueText.h"
 #include "plinth/metaobj/MetaList.h"
 #include "plinth/metaobj/MetaStruct.h"
@@ -10,15 +13,36 @@ using namespace MetaObj;
 
 namespace {
 
+bool XmlForbids(char32_t codePoint) {
+    return (codePoint < 0x20 && codePoint != '\t' && codePoint != '\n' && codePoint != '\r') || codePoint == 0xFFFE ||
+           codePoint == 0xFFFF;
+}
+
+// For element text and attribute values alike. The controls XML allows go
+// as character references: parsers keep those exactly, while a literal line
+// break or tab in an attribute is read as a blank and a literal carriage
+// return as a line feed. The characters XML cannot carry at all, even as
+// references, and bytes that are not UTF-8 become U+FFFD.
 std::string Escape(std::string const& text) {
     std::string escaped;
-    for (char c : text) {
-        switch (c) {
+    std::size_t position = 0;
+    char32_t codePoint = 0;
+    while (NextCodePointOrReplacement(text, position, codePoint)) {
+        switch (codePoint) {
         case '&': escaped += "&amp;"; break;
         case '<': escaped += "&lt;"; break;
         case '>': escaped += "&gt;"; break;
         case '"': escaped += "&quot;"; break;
-        default: escaped += c;
+        default:
+            if (XmlForbids(codePoint)) {
+                AppendUtf8(escaped, kReplacementCharacter);
+            } else if (IsControl(codePoint)) {
+                char reference[16];
+                std::snprintf(reference, sizeof reference, "&#x%X;", static_cast<unsigned>(codePoint));
+                escaped += reference;
+            } else {
+                AppendUtf8(escaped, codePoint);
+            }
         }
     }
     return escaped;

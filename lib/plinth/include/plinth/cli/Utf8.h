@@ -12,6 +12,18 @@ namespace Cli {
 // a value above U+10FFFF) or the text ends.
 bool NextCodePoint(std::string const& text, std::size_t& position, char32_t& codePoint);
 
+// The stand-in for bytes that are not strict UTF-8.
+char32_t const kReplacementCharacter = 0xFFFD;
+
+// Like NextCodePoint, but a byte where strict UTF-8 fails is read alone as
+// U+FFFD, so a loop over any text moves on. False only at the end of text.
+bool NextCodePointOrReplacement(std::string const& text, std::size_t& position, char32_t& codePoint);
+
+void AppendUtf8(std::string& text, char32_t codePoint);
+
+// text with every byte that is not part of strict UTF-8 replaced by U+FFFD.
+std::string ReplaceInvalidUtf8(std::string const& text);
+
 bool IsValidUtf8(std::string const& text);
 
 // C0 controls, DEL and the C1 controls (U+0080 to U+009F).
@@ -25,6 +37,16 @@ std::string TextProblem(std::string const& text);
 // not part of valid UTF-8 is written as \xHH (\u0085 for a C1 control), so
 // a refusal names a bad word without printing it raw.
 std::string VisibleText(std::string const& text);
+
+// The terminal columns a code point takes: 2 for East Asian Wide and
+// Fullwidth characters (CJK, kana, Hangul, fullwidth forms, most emoji), 0
+// for combining marks, zero-width and format characters and controls, 1 for
+// the rest.
+int CodePointWidth(char32_t codePoint);
+
+// The sum of the code points' widths; a byte that is not strict UTF-8 counts
+// 1, as a terminal shows it as one stand-in character.
+std::size_t DisplayWidth(std::string const& text);
 
 }  // namespace Cli
 }  // namespace Plinth

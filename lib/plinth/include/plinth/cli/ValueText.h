@@ -16,6 +16,13 @@ namespace Cli {
 // "{Title: value, ...}" with the fields the hints choose for a table.
 std::string InlineText(boost::shared_ptr<MetaObj::MetaObject> const& value, FormatHints const& hints);
 
+// text made safe to print on one line of a text formatter: a backslash is
+// doubled, tab, line feed and carriage return become \t, \n and \r, every
+// other control character and the Unicode line and paragraph separators
+// become \u and four hex digits ("\u001b"). Bytes that are not UTF-8 become
+// U+FFFD. Apart from them the escaping can be undone.
+std::string OneLineText(std::string const& text);
+
 // True for a list whose elements include a structure (shown as blocks).
 bool IsStructList(boost::shared_ptr<MetaObj::MetaObject> const& value);
 
