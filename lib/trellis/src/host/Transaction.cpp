@@ -2,8 +2,11 @@
 
 #include <stdexcept>
 
+#include <nlohmann/json.hpp>
+
 #include "host/Sqlite.h"
 #include "host/Store.h"
+#include "host/StoredText.h"
 
 namespace Trellis {
 namespace Host {
@@ -12,6 +15,17 @@ namespace {
 
 Json ParseStored(const std::string& text) {
     return Json::parse(text);
+}
+
+// The data as the store keeps it; a text that is not valid UTF-8 cannot be
+// written as JSON.
+std::string StorableText(const std::string& kind, const std::string& name, const Json& data) {
+    try {
+        if (IsValidUtf8(name)) return data.dump();
+    } catch (const nlohmann::json::type_error&) {
+    }
+    throw Gantry::Lib::GantryException("The host cannot store the " + kind + " record " + Quoted(name) +
+                                       ": it holds text that is not valid UTF-8");
 }
 
 }  // namespace
@@ -72,6 +86,7 @@ std::size_t Transaction::CountOf(const std::string& kind) const {
 
 void Transaction::PutData(const std::string& kind, const std::string& name, const Json& data) {
     RequireWrite();
+    const std::string text = StorableText(kind, name, data);
     GuardedSql(store_, [&] {
         // An upsert keeps the rowid, and so the record's place in its list.
         store_.Db()
@@ -79,7 +94,7 @@ void Transaction::PutData(const std::string& kind, const std::string& name, cons
                      " ON CONFLICT (kind, name) DO UPDATE SET data = excluded.data")
             .Bind(1, kind)
             .Bind(2, name)
-            .Bind(3, data.dump())
+            .Bind(3, text)
             .Run();
     });
 }

@@ -85,7 +85,12 @@ void WriteSectionOfDefault(Transaction& t, const std::string& key) {
 }
 
 std::string DescriptionText(const Json& description) {
-    return description.dump(2) + "\n";
+    try {
+        return description.dump(2) + "\n";
+    } catch (const nlohmann::json::type_error&) {
+        // Only text stored by an older build that checked less can get here.
+        throw Gantry::Lib::GantryException("The host store holds text that is not valid UTF-8; it cannot be exported");
+    }
 }
 
 std::string ExportHost() {
