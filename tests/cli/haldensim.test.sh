@@ -69,6 +69,28 @@ expect_stderr "haldensim: cannot read $WORK/none.json: No such file or directory
 sim export
 expect_stdout "$before"
 
+check "a description with bytes that are not UTF-8 is refused with their place"
+sim export
+before=$OUT
+printf '{"format": 1,\n "modules": [{"name": "caf\xe9", "loaded": true}]}' >"$WORK/latin1.json"
+sim import "$WORK/latin1.json"
+expect_status 2
+expect_stderr "haldensim: bad description: not valid UTF-8: the byte 0xE9 at line 2, column 27"
+
+check "import and init --from read regular files only, of at most 256 MiB"
+mkfifo "$WORK/fifo"
+truncate -s 300M "$WORK/huge.json"  # sparse: refused by its size, nothing is read
+for refusal in "$WORK: it is a directory" "$WORK/fifo: it is a FIFO, not a regular file" \
+               "/dev/zero: it is a device, not a regular file" "$WORK/huge.json: it is larger than 256 MiB"; do
+  run timeout 20 "$HALDENSIM" import "${refusal%%: *}"
+  expect_status 2
+  expect_stderr "haldensim: cannot read $refusal"
+done
+run timeout 20 "$HALDENSIM" init --from "$WORK/fifo"
+expect_status 2
+sim export
+expect_stdout "$before"
+
 check "init resets: default, empty, or from a description; faults and exec log go"
 sim fault add --operation Trellis_Exec --status 1
 sim init --empty
@@ -127,12 +149,38 @@ expect_stderr "haldensim: fault add needs --operation (see haldensim --help)"
 sim fault list --armed
 expect_stdout_empty
 
+check "a fault message must be valid UTF-8, not empty, without control characters"
+for case in $'\xff|is not valid UTF-8' '|must not be empty' $'two\nlines|contains the control character U+000A'; do
+  sim fault add --operation FirewallRuleset::Enable --message "${case%%|*}"
+  expect_status 2
+  expect_stderr "haldensim: The fault message ${case#*|}"
+done
+sim fault list --armed
+expect_stdout_empty
+
 check "usage errors exit with 2"
 for args in "" "frobnicate" "--bogus export" "export extra" "import" "fault" "fault remove" "fault list --all" "--host"; do
   sim $args
   expect_status 2
   expect_stderr_contains "haldensim: "
 done
+
+check "a host path must name a file; a relative XDG_STATE_HOME is ignored; --host once"
+sim --host "$WORK/made/" export
+expect_status 2
+expect_stderr "haldensim: Cannot open the host $WORK/made/: the path names a directory, not a file"
+run env HALDEN_HOST="$WORK/made/" "$HALDENCLI" network firewall get
+expect_status 2
+expect_stderr "Error: Cannot open the host $WORK/made/: the path names a directory, not a file"
+[ ! -e "$WORK/made" ] || fail_check "the refusal created $WORK/made"
+mkdir -p "$WORK/cwd"
+run env -C "$WORK/cwd" -u HALDEN_HOST XDG_STATE_HOME=state HOME="$WORK/home" "$HALDENSIM" export
+expect_status 0
+[ -f "$WORK/home/.local/state/halden/host.db" ] || fail_check "no host under HOME"
+[ ! -e "$WORK/cwd/state" ] || fail_check "the relative XDG_STATE_HOME was used"
+sim --host "$WORK/one.db" --host="$WORK/two.db" export
+expect_status 2
+expect_stderr "haldensim: --host is given twice (see haldensim --help)"
 
 check "a file that is not a host is refused and left alone"
 printf 'just some notes\n' >"$WORK/notes.txt"

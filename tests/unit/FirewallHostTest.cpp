@@ -168,6 +168,8 @@ TEST(FirewallHost, ForcedLoadReloadsWithNewOptionsOnlyWhenTheModuleIsIdle) {
     EXPECT_EQ(FailureOf([&] { module.Load("debug=1", true); }),
               "Module haldenfw is busy: the firewall filters must be destroyed before it is unloaded");
     SystemInfoImpl().DestroyFirewallFilters();
+    EXPECT_EQ(FailureOf([&] { module.Load("debug=1\n", true); }),
+              "Cannot load module haldenfw: the option text contains the control character U+000A");
     module.Load("debug=1", true);
     EXPECT_EQ(Json::parse(Trellis::Host::ExportHost())["modules"][0]["options"], "debug=1");
     EXPECT_TRUE(module.IsLoaded());
@@ -199,6 +201,9 @@ TEST(FirewallHost, DynamicRulesLiveUntilTheRulesetsAreLoadedOrTheFiltersDestroye
               "Invalid port range 90-80 of the firewall rule \"bad\": ports run from 0 to 65535, the first not above "
               "the last");
     EXPECT_NE(FailureOf([&] { systemInfo.AddFirewallDynamicRule(tooHigh); }), "");
+    FirewallRule escape = Rule("vnc\x1b", FirewallRule::PORT_TYPE_DST, 5900, 5900, 0, 0);
+    EXPECT_EQ(FailureOf([&] { systemInfo.AddFirewallDynamicRule(escape); }),
+              "Invalid firewall rule \"vnc\\u001b\": its name contains the control character U+001B");
 
     systemInfo.LoadFirewallRulesets();
     EXPECT_TRUE(DynamicRuleNames().empty());

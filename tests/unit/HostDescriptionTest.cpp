@@ -127,3 +127,29 @@ TEST(HostDescription, ImportReplacesTheWholeHost) {
         "faults": [], "exec": []})"));
     EXPECT_TRUE(ListFaults().empty());  // the faults were replaced too, and this process knows it
 }
+
+TEST(HostDescription, TextThatCannotBeReadAsOneDescriptionIsRefusedWithItsPlace) {
+    TempHost host;
+    const std::string before = ExportHost();
+    const std::vector<std::pair<std::string, std::string>> cases = {
+        // A key twice: the parser alone would keep the last and say nothing.
+        {R"({"format": 1, "format": 1})", "top level: duplicate key \"format\""},
+        {R"({"format": 1, "modules": [1, [2, {}], {"a": 1, "a": 2}]})", "modules[2]: duplicate key \"a\""},
+        // Numbers that are no integers, even where their value is one.
+        {R"({"format": 1.0})", "format: expected 1, the format this version reads"},
+        {R"({"format": 1, "portGroups": [{"name": "pg", "vswitch": "s", "vlanId": 1e0}]})",
+         "portGroups[0].vlanId: expected an integer from 0 to 4095"},
+        // Control characters in names and keys; an empty fault message.
+        {R"({"format": 1, "modules": [{"name": "fw\u001b[2J", "loaded": true}]})",
+         "modules[0].name: the text contains the control character U+001B"},
+        {R"({"format": 1, "x\u0085": 1})", "\"x\\u0085\": unknown field"},
+        {R"({"format": 1, "faults": [{"operation": "FirewallRuleset::Enable", "message": ""}]})",
+         "faults[0]: The fault message must not be empty"},
+        // Bytes that are not UTF-8, inside a string or outside one.
+        {"{\"format\": 1,\n  \"modules\": [{\"name\": \"caf\xe9\", \"loaded\": true}]}",
+         "not valid UTF-8: the byte 0xE9 at line 2, column 28"},
+        {"{\"format\": 1}\xff", "not valid UTF-8: the byte 0xFF at line 1, column 14"},
+    };
+    for (const auto& [text, refusal] : cases) EXPECT_EQ(RefusalOf(text), refusal) << text;
+    EXPECT_EQ(ExportHost(), before);
+}

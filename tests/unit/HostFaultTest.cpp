@@ -61,6 +61,8 @@ TEST(HostFaults, TrellisExecLogsTheCommandAndReturnsTheFaultStatus) {
     ArmFault({"Trellis_Exec", "", 3, 1});
     EXPECT_EQ(Trellis_Exec("/etc/init.d/xfrd restart", false, true, false), 3);
     EXPECT_EQ(Trellis_Exec("true", true, false, true), 0);
+    EXPECT_EQ(FailureOf([] { Trellis_Exec("echo \xff", false, false, false); }),
+              "Trellis_Exec: the command line is not valid UTF-8");  // and nothing is logged
     EXPECT_EQ(ReadExecLog(), (std::vector<ExecEntry>{{"/etc/init.d/xfrd restart", {false, true, false}, 0},
                                                      {"/etc/init.d/xfrd restart", {false, true, false}, 3},
                                                      {"true", {true, false, true}, 0}}));

@@ -1,6 +1,7 @@
 // The host store: refusal of files that are not host stores, migration,
-// concurrent writers, a writer killed mid-transaction. First use, alone and
-// concurrent, and a text file for a host are proven through haldensim in
+// concurrent writers, a writer killed mid-transaction, what a killed creator
+// leaves. First use, alone and concurrent, a text file for a host and paths
+// that name no file are proven through haldensim in
 // tests/cli/haldensim.test.sh.
 
 #include <signal.h>
@@ -8,6 +9,7 @@
 #include <sys/wait.h>
 #include <unistd.h>
 
+#include <filesystem>
 #include <fstream>
 #include <iterator>
 
@@ -189,4 +191,23 @@ TEST(HostStore, WriterKilledMidTransactionLeavesTheStoreUsableAndUnchanged) {
     EXPECT_EQ(CounterValue("doomed5"), 0);
     Increment("after");  // the write lock died with the writer
     EXPECT_EQ(CounterValue("after"), 1);
+}
+
+TEST(HostStore, TheNextOpenRemovesWhatAKilledCreatorLeftAndSparesAllElse) {
+    TempHost host;
+    CloseHost();
+    pid_t gone = fork();
+    ASSERT_GE(gone, 0);
+    if (gone == 0) _exit(0);
+    ASSERT_EQ(waitpid(gone, nullptr, 0), gone);  // reaped: no process has that id now
+    const std::string dead = host.Path() + ".new-" + std::to_string(gone) + "-0";
+    const std::string live = host.Path() + ".new-" + std::to_string(getpid()) + "-0";
+    const std::vector<std::string> abandoned = {dead, dead + "-journal", dead + "-wal", dead + "-shm"};
+    const std::vector<std::string> kept = {live, live + "-wal", dead + "-backup", host.Path() + ".new-notes",
+                                           host.Dir() + "/other.db.new-" + std::to_string(gone) + "-0"};
+    for (const std::string& file : abandoned) WriteBytes(file, "half a host");
+    for (const std::string& file : kept) WriteBytes(file, "half a host");
+    host.Reopen();
+    for (const std::string& file : abandoned) EXPECT_FALSE(std::filesystem::exists(file)) << file;
+    for (const std::string& file : kept) EXPECT_TRUE(std::filesystem::exists(file)) << file;
 }

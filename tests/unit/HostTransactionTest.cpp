@@ -4,8 +4,10 @@
 
 #include <gtest/gtest.h>
 
+#include "FailureOf.h"
 #include "HostTestRecords.h"
 #include "TempHost.h"
+#include "trellis/host/ExecLog.h"
 #include "trellis/host/records/FirewallRecords.h"
 
 using namespace Trellis::Host;
@@ -98,6 +100,20 @@ TEST(HostTransaction, MisuseIsRefused) {
         EXPECT_NE(std::string(e.what()).find("test.counter \"bad\".value: expected an integer"), std::string::npos)
             << e.what();
     }
+    // So is one whose data is not JSON at all, looked up or listed.
+    ASSERT_EQ(sqlite3_open(host.Path().c_str(), &db), SQLITE_OK);
+    ASSERT_EQ(sqlite3_exec(db,
+                           "DELETE FROM records WHERE name = 'bad';"
+                           "INSERT INTO records VALUES ('test.counter', 'torn', '{\"name\":\"to');"
+                           "INSERT INTO exec_log (command_line, options, status) VALUES ('true', '[true]', 0)",
+                           nullptr, nullptr, nullptr),
+              SQLITE_OK);
+    sqlite3_close(db);
+    const std::string torn = "The host store holds a damaged record: test.counter \"torn\": its data is not valid JSON";
+    EXPECT_EQ(FailureOf([] { CounterValue("torn"); }), torn);
+    EXPECT_EQ(FailureOf([] { kRead.Read([](Transaction& t) { return t.List<CounterRecord>(); }); }), torn);
+    EXPECT_EQ(FailureOf([] { ReadExecLog(); }),
+              "The host store holds a damaged record: exec log entry 1: its options are not three flags");
 
     CloseHost();
     EXPECT_THROW(CounterValue("x"), Gantry::Lib::GantryException);

@@ -51,6 +51,8 @@ void AddSwitch(const std::string& name, int numPorts) {
 TEST(SwitchHost, CreatingASwitchChecksItsNameAndThePortBudgetOfTheHost) {
     TempHost host;  // switch0 has 128 ports
     EXPECT_EQ(FailureOf([] { AddSwitch("", 64); }), "Unable to create a virtual switch: its name must not be empty");
+    EXPECT_EQ(FailureOf([] { AddSwitch("sw\x1b", 64); }),
+              "Unable to create virtual switch \"sw\\u001b\": its name contains the control character U+001B");
     EXPECT_EQ(FailureOf([] { AddSwitch("x", 0); }),
               "Unable to create virtual switch x: 0 is not a valid number of ports (1 to 4096)");
     EXPECT_EQ(FailureOf([] { AddSwitch("x", 4097); }),
@@ -94,6 +96,8 @@ TEST(SwitchHost, APortGroupNeedsANameAndAVlanIdInRange) {
     auto switch1 = SwitchNamed("switch1");
     EXPECT_EQ(FailureOf([&] { delete switch1->AddPortGroup(""); }),
               "Unable to add port group  to virtual switch switch1: a port group name must not be empty");
+    EXPECT_EQ(FailureOf([&] { delete switch1->AddPortGroup("bad\xff"); }),
+              "Unable to add port group \"bad\\ufffd\" to virtual switch switch1: its name is not valid UTF-8");
 
     std::unique_ptr<Gantry::Network::PortGroup> storage(switch1->AddPortGroup("Storage"));
     EXPECT_EQ(storage->GetVirtualSwitchName(), "switch1");
@@ -196,7 +200,7 @@ TEST(SwitchHost, APortGroupOverridesOnlyWhatItSetsAndAnEmptyMaskFollowsItsSwitch
     EXPECT_FALSE(GroupNamed("Guest Network")->GetSecurityPolicy().allowPromiscuous);
 }
 
-TEST(SwitchHost, ATeamingPolicyWithAnUnknownLoadBalancingIsRefused) {
+TEST(SwitchHost, ATeamingPolicyWithAnUnknownLoadBalancingOrABadUplinkNameIsRefused) {
     TempHost host;
     NicTeamingPolicy policy;
     policy.SetTeamingPolicy(static_cast<Gantry::Network::TeamPolicyType>(7));
@@ -204,6 +208,11 @@ TEST(SwitchHost, ATeamingPolicyWithAnUnknownLoadBalancingIsRefused) {
               "Invalid load balancing policy 7 for virtual switch switch0");
     EXPECT_EQ(FailureOf([&] { GroupNamed("Guest Network")->ApplyTeamingPolicy(policy); }),
               "Invalid load balancing policy 7 for port group Guest Network");
+    NicTeamingPolicy order;
+    order.SetUplinkOrder({"pnet0", "pnet\x01"});
+    EXPECT_EQ(FailureOf([&] { SwitchNamed("switch0")->ApplyTeamingPolicy(order); }),
+              "Invalid uplink \"pnet\\u0001\" in the teaming policy of virtual switch switch0: its name contains the "
+              "control character U+0001");
 }
 
 TEST(SwitchHost, TheDescriptionRefusesSwitchingThatCannotBe) {

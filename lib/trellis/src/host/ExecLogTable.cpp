@@ -9,6 +9,19 @@
 namespace Trellis {
 namespace Host {
 
+namespace {
+
+std::array<bool, 3> ReadOptions(const std::string& text, std::int64_t id) {
+    try {
+        return nlohmann::json::parse(text).get<std::array<bool, 3>>();
+    } catch (const nlohmann::json::exception&) {
+        throw Gantry::Lib::GantryException("The host store holds a damaged record: exec log entry " +
+                                           std::to_string(id) + ": its options are not three flags");
+    }
+}
+
+}  // namespace
+
 void AppendExecEntry(Database& db, const ExecEntry& entry) {
     db.Prepare("INSERT INTO exec_log (command_line, options, status) VALUES (?, ?, ?)")
         .Bind(1, entry.commandLine)
@@ -19,11 +32,11 @@ void AppendExecEntry(Database& db, const ExecEntry& entry) {
 
 std::vector<ExecEntry> ReadExecEntries(Database& db) {
     std::vector<ExecEntry> entries;
-    Statement query = db.Prepare("SELECT command_line, options, status FROM exec_log ORDER BY id");
+    Statement query = db.Prepare("SELECT command_line, options, status, id FROM exec_log ORDER BY id");
     while (query.Step()) {
         ExecEntry entry;
         entry.commandLine = query.Text(0);
-        entry.options = nlohmann::json::parse(query.Text(1)).get<std::array<bool, 3>>();
+        entry.options = ReadOptions(query.Text(1), query.Int(3));
         entry.status = static_cast<int>(query.Int(2));
         entries.push_back(entry);
     }

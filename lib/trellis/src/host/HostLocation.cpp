@@ -19,9 +19,12 @@ std::string ResolveHostPath(const std::string& hostOption) {
     std::string fromEnv = EnvOrEmpty("HALDEN_HOST");
     if (!fromEnv.empty()) return fromEnv;
     std::string stateHome = EnvOrEmpty("XDG_STATE_HOME");
-    if (stateHome.empty()) {
+    // The XDG base directory rules: a relative path there is to be ignored.
+    if (stateHome.empty() || stateHome[0] != '/') {
         std::string home = EnvOrEmpty("HOME");
-        if (home.empty()) throw HostOpenError("Cannot locate the host: neither --host, HALDEN_HOST, XDG_STATE_HOME nor HOME is set");
+        if (home.empty())
+            throw HostOpenError(
+                "Cannot locate the host: neither --host, HALDEN_HOST, an absolute XDG_STATE_HOME nor HOME is set");
         stateHome = home + "/.local/state";
     }
     return stateHome + "/halden/host.db";

@@ -2,16 +2,10 @@
 
 #include <nlohmann/json.hpp>
 
+#include "host/StoredText.h"
+
 namespace Trellis {
 namespace Host {
-
-namespace {
-
-std::string Quoted(const std::string& text) {
-    return Json(text).dump();
-}
-
-}  // namespace
 
 JsonReader::JsonReader(const Json* value, std::string path) : value_(value), path_(std::move(path)) {}
 
@@ -30,7 +24,10 @@ void JsonReader::ExpectObject() const {
 
 std::string JsonReader::AsString() const {
     if (!Value().is_string()) Fail("expected a string");
-    return value_->get<std::string>();
+    std::string text = value_->get<std::string>();
+    std::string problem = TextProblem(text);
+    if (!problem.empty()) Fail("the text " + problem);
+    return text;
 }
 
 std::string JsonReader::PathOf(const std::string& key) const {
@@ -135,7 +132,7 @@ std::vector<std::string> JsonReader::StringArray(const char* key) const {
 void JsonReader::RejectUnknownMembers() const {
     ExpectObject();
     for (auto it = value_->begin(); it != value_->end(); ++it)
-        if (!used_.count(it.key())) JsonReader(&it.value(), PathOf(it.key())).Fail("unknown field");
+        if (!used_.count(it.key())) JsonReader(&it.value(), PathOf(Printable(it.key()))).Fail("unknown field");
 }
 
 }  // namespace Host

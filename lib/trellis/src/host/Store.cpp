@@ -48,6 +48,9 @@ Store::Store(std::string path, std::unique_ptr<Database> db)
     : path_(std::move(path)), db_(std::move(db)), faults_(*db_) {}
 
 std::unique_ptr<Store> Store::Open(const std::string& path) {
+    std::string file = std::filesystem::path(path).filename().string();
+    if (file.empty() || file == "." || file == "..") Refuse(path, "the path names a directory, not a file");
+    RemoveAbandonedTemporaries(path);
     std::error_code error;
     if (!std::filesystem::exists(path, error)) CreateHostFile(path);
     std::unique_ptr<Database> db;

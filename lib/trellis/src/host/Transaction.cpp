@@ -2,16 +2,39 @@
 
 #include <stdexcept>
 
+#include <nlohmann/json.hpp>
+
 #include "host/Sqlite.h"
 #include "host/Store.h"
+#include "host/StoredText.h"
 
 namespace Trellis {
 namespace Host {
 
 namespace {
 
-Json ParseStored(const std::string& text) {
-    return Json::parse(text);
+[[noreturn]] void Damaged(const std::string& kind, const std::string& name, const std::string& problem) {
+    throw Gantry::Lib::GantryException("The host store holds a damaged record: " + kind + " \"" + name + "\": " +
+                                       problem);
+}
+
+Json ParseStored(const std::string& kind, const std::string& name, const std::string& text) {
+    try {
+        return Json::parse(text);
+    } catch (const nlohmann::json::parse_error&) {
+        Damaged(kind, name, "its data is not valid JSON");
+    }
+}
+
+// The data as the store keeps it; a text that is not valid UTF-8 cannot be
+// written as JSON.
+std::string StorableText(const std::string& kind, const std::string& name, const Json& data) {
+    try {
+        if (IsValidUtf8(name)) return data.dump();
+    } catch (const nlohmann::json::type_error&) {
+    }
+    throw Gantry::Lib::GantryException("The host cannot store the " + kind + " record " + Quoted(name) +
+                                       ": it holds text that is not valid UTF-8");
 }
 
 }  // namespace
@@ -29,7 +52,7 @@ std::optional<Json> Transaction::FindData(const std::string& kind, const std::st
         Statement query = store_.Db().Prepare("SELECT data FROM records WHERE kind = ? AND name = ?");
         query.Bind(1, kind).Bind(2, name);
         if (!query.Step()) return std::nullopt;
-        return ParseStored(query.Text(0));
+        return ParseStored(kind, name, query.Text(0));
     });
 }
 
@@ -38,7 +61,10 @@ std::vector<std::pair<std::string, Json>> Transaction::ListData(const std::strin
         std::vector<std::pair<std::string, Json>> records;
         Statement query = store_.Db().Prepare("SELECT name, data FROM records WHERE kind = ? ORDER BY rowid");
         query.Bind(1, kind);
-        while (query.Step()) records.emplace_back(query.Text(0), ParseStored(query.Text(1)));
+        while (query.Step()) {
+            std::string name = query.Text(0);
+            records.emplace_back(name, ParseStored(kind, name, query.Text(1)));
+        }
         return records;
     });
 }
@@ -72,6 +98,7 @@ std::size_t Transaction::CountOf(const std::string& kind) const {
 
 void Transaction::PutData(const std::string& kind, const std::string& name, const Json& data) {
     RequireWrite();
+    const std::string text = StorableText(kind, name, data);
     GuardedSql(store_, [&] {
         // An upsert keeps the rowid, and so the record's place in its list.
         store_.Db()
@@ -79,7 +106,7 @@ void Transaction::PutData(const std::string& kind, const std::string& name, cons
                      " ON CONFLICT (kind, name) DO UPDATE SET data = excluded.data")
             .Bind(1, kind)
             .Bind(2, name)
-            .Bind(3, data.dump())
+            .Bind(3, text)
             .Run();
     });
 }

@@ -4,6 +4,7 @@
 
 #include "PolicyInheritance.h"
 #include "gantry/lib/GantryException.h"
+#include "host/StoredText.h"
 
 namespace Trellis {
 namespace Network {
@@ -16,15 +17,20 @@ using Trellis::Host::Transaction;
 
 void Refuse(std::string const& message) { throw Gantry::Lib::GantryException(message); }
 
+void RequireStorableName(std::string const& name, std::string const& refusal) {
+    std::string problem = Trellis::Host::TextProblem(name);
+    if (!problem.empty()) Refuse(refusal + "its name " + problem);
+}
+
 StandardSwitchRecord RequireSwitch(Transaction const& t, std::string const& name) {
     std::optional<StandardSwitchRecord> vswitch = t.Find<StandardSwitchRecord>(name);
-    if (!vswitch) Refuse("Virtual switch " + name + " does not exist");
+    if (!vswitch) Refuse("Virtual switch " + Trellis::Host::Printable(name) + " does not exist");
     return *vswitch;
 }
 
 PortGroupRecord RequirePortGroup(Transaction const& t, std::string const& name) {
     std::optional<PortGroupRecord> group = t.Find<PortGroupRecord>(name);
-    if (!group) Refuse("Port group " + name + " does not exist");
+    if (!group) Refuse("Port group " + Trellis::Host::Printable(name) + " does not exist");
     return *group;
 }
 
@@ -83,6 +89,10 @@ Gantry::Network::NicTeamingPolicy StorableTeamingPolicy(Gantry::Network::NicTeam
     auto value = static_cast<std::uint32_t>(policy.teamPolicy);
     if ((policy.setMask & NicTeamingPolicy::MASK_TEAM_POLICY) != 0 && (value < 1 || value > 4))
         Refuse("Invalid load balancing policy " + std::to_string(value) + " for " + owner);
+    if ((policy.setMask & NicTeamingPolicy::MASK_UPLINK_ORDER) != 0)
+        for (std::string const& uplink : policy.uplinkOrder)
+            RequireStorableName(uplink, "Invalid uplink " + Trellis::Host::Printable(uplink) +
+                                            " in the teaming policy of " + owner + ": ");
     policy.setMask &= ~NicTeamingPolicy::MASK_RESERVED0;
     policy.reserved0 = false;
     return policy;

@@ -18,6 +18,9 @@ namespace Network {
 namespace SwitchStore {
 
 [[noreturn]] void Refuse(std::string const& message);
+// Refuses a name the host cannot keep (not valid UTF-8, or with a control
+// character), the refusal text first: "Unable to ...: its name is not valid UTF-8".
+void RequireStorableName(std::string const& name, std::string const& refusal);
 
 Trellis::Host::StandardSwitchRecord RequireSwitch(Trellis::Host::Transaction const& t, std::string const& name);
 Trellis::Host::PortGroupRecord RequirePortGroup(Trellis::Host::Transaction const& t, std::string const& name);
@@ -40,8 +43,9 @@ Trellis::Host::StoredPolicies PortGroupPolicies(Trellis::Host::Transaction const
                                                 Trellis::Host::PortGroupRecord const& group);
 
 // The teaming policy as the host stores it for owner ("virtual switch
-// switch0"): refuses a load balancing policy outside 1..4, and drops the
-// unnamed flag, which the host does not keep.
+// switch0"): refuses a load balancing policy outside 1..4 and an uplink
+// order with a name the host cannot keep, and drops the unnamed flag, which
+// the host does not keep.
 Gantry::Network::NicTeamingPolicy StorableTeamingPolicy(Gantry::Network::NicTeamingPolicy policy,
                                                         std::string const& owner);
 

@@ -5,6 +5,7 @@
 
 #include "PolicyInheritance.h"
 #include "SwitchStore.h"
+#include "host/StoredText.h"
 #include "trellis/host/Operation.h"
 #include "trellis/host/records/PnicRecord.h"
 #include "trellis/network/PortGroupImpl.h"
@@ -135,7 +136,8 @@ void VirtualSwitchImpl::SetMtu(int mtu) {
 
 void VirtualSwitchImpl::AddUplink(std::string const& nicName) {
     Update(kAddUplink, [&](Transaction& t, StandardSwitchRecord& record) {
-        const std::string refusal = "Unable to add uplink " + nicName + " to virtual switch " + name_ + ": ";
+        const std::string refusal =
+            "Unable to add uplink " + Trellis::Host::Printable(nicName) + " to virtual switch " + name_ + ": ";
         if (!t.Contains<Trellis::Host::PnicRecord>(nicName))
             SwitchStore::Refuse(refusal + "there is no physical NIC of that name");
         if (Contains(record.uplinks, nicName)) SwitchStore::Refuse(refusal + "it is already an uplink of this switch");
@@ -160,9 +162,10 @@ void VirtualSwitchImpl::RemoveUplink(std::string const& nicName) {
 Gantry::Network::PortGroup* VirtualSwitchImpl::AddPortGroup(std::string const& portGroupName) {
     PortGroupRecord created = kAddPortGroup.Write([&](Transaction& t) {
         SwitchStore::RequireSwitch(t, name_);
-        const std::string refusal =
-            "Unable to add port group " + portGroupName + " to virtual switch " + name_ + ": ";
+        const std::string refusal = "Unable to add port group " + Trellis::Host::Printable(portGroupName) +
+                                    " to virtual switch " + name_ + ": ";
         if (portGroupName.empty()) SwitchStore::Refuse(refusal + "a port group name must not be empty");
+        SwitchStore::RequireStorableName(portGroupName, refusal);
         if (std::optional<PortGroupRecord> taken = t.Find<PortGroupRecord>(portGroupName))
             SwitchStore::Refuse(refusal + "a port group of that name already exists on virtual switch " +
                                 taken->vswitch);

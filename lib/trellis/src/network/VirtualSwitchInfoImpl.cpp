@@ -4,6 +4,7 @@
 #include <utility>
 
 #include "SwitchStore.h"
+#include "host/StoredText.h"
 #include "trellis/host/Operation.h"
 #include "trellis/network/VirtualSwitchImpl.h"
 
@@ -37,8 +38,9 @@ Gantry::Network::VirtualSwitch* VirtualSwitchInfoImpl::AddVirtualSwitchWithPolic
     Gantry::Network::ShapingPolicy const& shaping, Gantry::Network::NicCapabilities const& /*capabilities*/,
     std::string const& name, int numPorts) {
     StandardSwitchRecord created = kAddVirtualSwitchWithPolicy.Write([&](Transaction& t) {
-        const std::string refusal = "Unable to create virtual switch " + name + ": ";
+        const std::string refusal = "Unable to create virtual switch " + Trellis::Host::Printable(name) + ": ";
         if (name.empty()) SwitchStore::Refuse("Unable to create a virtual switch: its name must not be empty");
+        SwitchStore::RequireStorableName(name, refusal);
         if (t.Contains<StandardSwitchRecord>(name))
             SwitchStore::Refuse(refusal + "a virtual switch of that name already exists");
         if (numPorts < SwitchLimits::kMinPorts || numPorts > SwitchLimits::kMaxPortsPerSwitch)

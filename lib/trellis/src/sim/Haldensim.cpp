@@ -1,13 +1,11 @@
 #include "trellis/sim/Haldensim.h"
 
 #include <algorithm>
-#include <cerrno>
-#include <cstring>
-#include <fstream>
 #include <iostream>
-#include <sstream>
 
 #include "gantry/lib/GantryException.h"
+#include "host/StoredText.h"
+#include "sim/DescriptionInput.h"
 #include "sim/SimOptions.h"
 #include "trellis/host/Description.h"
 #include "trellis/host/Faults.h"
@@ -42,7 +40,8 @@ const char* const kInitHelp =
     "Usage: haldensim [--host PATH] init [--empty | --from FILE]\n"
     "\n"
     "Replaces the whole host (records, faults, exec log) with the default inventory,\n"
-    "with an empty host (--empty), or with the description in FILE (--from).\n";
+    "with an empty host (--empty), or with the description in FILE (--from; '-' for\n"
+    "standard input). FILE is a regular file of at most 256 MiB.\n";
 
 const char* const kExportHelp =
     "Usage: haldensim [--host PATH] export\n"
@@ -52,7 +51,8 @@ const char* const kExportHelp =
 const char* const kImportHelp =
     "Usage: haldensim [--host PATH] import FILE\n"
     "\n"
-    "Replaces the whole host with the description in FILE ('-' for standard input).\n"
+    "Replaces the whole host with the description in FILE ('-' for standard input),\n"
+    "a regular file of at most 256 MiB.\n"
     "The description is checked first; a refused one leaves the host unchanged.\n"
     "Faults and the exec log are replaced too: empty unless the description holds them.\n";
 
@@ -81,26 +81,13 @@ struct Io {
     std::ostream& out;
 };
 
-std::string ReadDescriptionFile(const std::string& file, std::istream& in) {
-    std::ostringstream text;
-    if (file == "-") {
-        text << in.rdbuf();
-        return text.str();
-    }
-    errno = 0;
-    std::ifstream stream(file, std::ios::binary);
-    if (!stream) throw Refused("cannot read " + file + (errno ? std::string(": ") + std::strerror(errno) : ""));
-    text << stream.rdbuf();
-    return text.str();
-}
-
 // The host is resolved and opened only by commands that work on it, never for help.
 void OpenHostOf(const std::string& hostOption) {
     Host::OpenHost(Host::ResolveHostPath(hostOption));
 }
 
 void RequireNoPositionals(const ParsedOptions& options) {
-    if (!options.positionals.empty()) throw UsageError("unexpected argument \"" + options.positionals[0] + "\"");
+    if (!options.positionals.empty()) throw UsageError("unexpected argument " + Host::Quoted(options.positionals[0]));
 }
 
 int Init(const std::vector<std::string>& args, std::size_t next, const std::string& hostOption, Io& io) {
@@ -110,7 +97,7 @@ int Init(const std::vector<std::string>& args, std::size_t next, const std::stri
     if (options.Has("empty") && options.Has("from")) throw UsageError("--empty and --from exclude each other");
     std::string description = Host::kDefaultHostDescription;
     if (options.Has("empty")) description = "{\"format\": 1}";
-    if (options.Has("from")) description = ReadDescriptionFile(*options.Get("from"), io.in);
+    if (options.Has("from")) description = ReadDescriptionInput(*options.Get("from"), io.in);
     OpenHostOf(hostOption);
     Host::ImportHost(description);
     return kExitOk;
@@ -129,7 +116,7 @@ int Import(const std::vector<std::string>& args, std::size_t next, const std::st
     ParsedOptions options = ParseOptions(args, next, {});
     if (options.Has("help")) return io.out << kImportHelp, kExitOk;
     if (options.positionals.size() != 1) throw UsageError("import takes one FILE");
-    std::string description = ReadDescriptionFile(options.positionals[0], io.in);
+    std::string description = ReadDescriptionInput(options.positionals[0], io.in);
     OpenHostOf(hostOption);
     Host::ImportHost(description);
     return kExitOk;
@@ -193,7 +180,7 @@ int FaultCommand(const std::vector<std::string>& args, std::size_t next, const s
     } else if (action == "--help") {
         return io.out << kFaultHelp, kExitOk;
     } else {
-        throw UsageError("unknown fault command \"" + action + "\"");
+        throw UsageError("unknown fault command " + Host::Quoted(action));
     }
     if (options.Has("help")) return io.out << kFaultHelp, kExitOk;
     RequireNoPositionals(options);
@@ -212,9 +199,13 @@ int FaultCommand(const std::vector<std::string>& args, std::size_t next, const s
 int Dispatch(const std::vector<std::string>& args, Io& io) {
     std::size_t next = 0;
     std::string hostOption;
+    bool hostSeen = false;
     while (next < args.size() && args[next].compare(0, 2, "--") == 0) {
         const std::string& arg = args[next];
         if (arg == "--help") return io.out << kMainHelp, kExitOk;
+        bool isHost = arg == "--host" || arg.compare(0, 7, "--host=") == 0;
+        if (isHost && hostSeen) throw UsageError("--host is given twice");
+        hostSeen = hostSeen || isHost;
         if (arg == "--host") {
             if (next + 1 >= args.size()) throw UsageError("--host needs a value");
             hostOption = args[next + 1];
@@ -223,7 +214,7 @@ int Dispatch(const std::vector<std::string>& args, Io& io) {
             hostOption = arg.substr(7);
             next += 1;
         } else {
-            throw UsageError("unknown option " + arg);
+            throw UsageError("unknown option " + Host::Printable(arg));
         }
         if (hostOption.empty()) throw UsageError("--host needs a path");
     }
@@ -233,7 +224,7 @@ int Dispatch(const std::vector<std::string>& args, Io& io) {
     if (command == "export") return Export(args, next + 1, hostOption, io);
     if (command == "import") return Import(args, next + 1, hostOption, io);
     if (command == "fault") return FaultCommand(args, next + 1, hostOption, io);
-    throw UsageError("unknown command \"" + command + "\"");
+    throw UsageError("unknown command " + Host::Quoted(command));
 }
 
 }  // namespace
@@ -246,6 +237,9 @@ int RunHaldensim(const std::vector<std::string>& args, std::istream& in, std::os
         err << "haldensim: " << e.what() << " (see haldensim --help)\n";
         return kExitRefused;
     } catch (const Refused& e) {
+        err << "haldensim: " << e.what() << "\n";
+        return kExitRefused;
+    } catch (const UnreadableInput& e) {
         err << "haldensim: " << e.what() << "\n";
         return kExitRefused;
     } catch (const Host::HostOpenError& e) {

@@ -4,6 +4,8 @@
 #include <climits>
 #include <cstdlib>
 
+#include "host/StoredText.h"
+
 namespace Trellis {
 namespace Sim {
 
@@ -33,7 +35,7 @@ ParsedOptions ParseOptions(const std::vector<std::string>& args, std::size_t fir
         if (name == "help") option = &kHelp;
         for (const OptionSpec& candidate : specs)
             if (candidate.name == name) option = &candidate;
-        if (!option) throw UsageError("unknown option --" + name);
+        if (!option) throw UsageError("unknown option --" + Host::Printable(name));
         if (parsed.Has(name)) throw UsageError("--" + name + " is given twice");
         if (option->takesValue && !value) {
             if (i + 1 >= args.size()) throw UsageError("--" + name + " needs a value");
@@ -52,7 +54,7 @@ int ParseInt(const std::string& option, const std::string& text) {
     long value = std::strtol(text.c_str(), &end, 10);
     bool digitsOnly = !text.empty() && *end == '\0' && text.find_first_of(" \t\n") == std::string::npos;
     if (!digitsOnly || errno == ERANGE || value < INT_MIN || value > INT_MAX)
-        throw UsageError(option + " expects an integer, not \"" + text + "\"");
+        throw UsageError(option + " expects an integer, not " + Host::Quoted(text));
     return static_cast<int>(value);
 }
 

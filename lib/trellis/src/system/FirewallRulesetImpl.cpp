@@ -5,6 +5,7 @@
 #include <utility>
 
 #include "gantry/lib/GantryException.h"
+#include "host/StoredText.h"
 #include "host/records/AllowedIpText.h"
 #include "system/FirewallHost.h"
 #include "trellis/host/Operation.h"
@@ -34,7 +35,7 @@ const Operation kRemoveAllowedIp("FirewallRuleset::RemoveAllowedIp");
 
 AllowedIp RequireAllowedIp(const std::string& text) {
     std::optional<AllowedIp> entry = Host::ParseAllowedIp(text);
-    if (!entry) throw Gantry::Lib::GantryException("Invalid IP address or network: " + text);
+    if (!entry) throw Gantry::Lib::GantryException("Invalid IP address or network: " + Host::Printable(text));
     return *entry;
 }
 

@@ -1,6 +1,7 @@
 #include "trellis/system/ModuleImpl.h"
 
 #include "gantry/lib/GantryException.h"
+#include "host/StoredText.h"
 #include "system/FirewallHost.h"
 #include "trellis/host/Operation.h"
 #include "trellis/host/records/ModuleRecord.h"
@@ -48,6 +49,9 @@ void ModuleImpl::Load(std::string const& options, bool force) {
     kLoad.Write([&](Transaction& t) {
         std::optional<ModuleRecord> module = t.Find<ModuleRecord>(name_);
         if (!module) throw Gantry::Lib::GantryException("Cannot load module " + name_ + ": no such module on the host");
+        std::string problem = Host::TextProblem(options);
+        if (!problem.empty())
+            throw Gantry::Lib::GantryException("Cannot load module " + name_ + ": the option text " + problem);
         if (module->loaded) {
             if (!force) throw Gantry::Lib::GantryException("Module " + name_ + " is already loaded");
             CheckNotBusy(t, name_);

@@ -5,6 +5,7 @@
 #include <utility>
 
 #include "gantry/lib/GantryException.h"
+#include "host/StoredText.h"
 #include "system/FirewallHost.h"
 #include "trellis/host/Operation.h"
 #include "trellis/system/FirewallRulesetImpl.h"
@@ -105,6 +106,10 @@ std::vector<FirewallRule*> SystemInfoImpl::GetFirewallDynamicRules() {
 
 void SystemInfoImpl::AddFirewallDynamicRule(FirewallRule& rule) {
     kAddFirewallDynamicRule.Write([&](Transaction& t) {
+        std::string problem = Host::TextProblem(rule.name);
+        if (!problem.empty())
+            throw Gantry::Lib::GantryException("Invalid firewall rule " + Host::Quoted(rule.name) + ": its name " +
+                                               problem);
         CheckPortRange(rule);
         if (!LoadedFirewallState(t).rulesetsLoaded)
             throw Gantry::Lib::GantryException("The firewall rulesets are not loaded");

@@ -2,6 +2,7 @@
 
 #include "host/ExecLogTable.h"
 #include "host/Store.h"
+#include "host/StoredText.h"
 #include "trellis/host/Operation.h"
 
 namespace Trellis {
@@ -14,6 +15,9 @@ const Host::Operation kTrellisExec("Trellis_Exec", Host::FaultKind::Status);
 }  // namespace
 
 int Trellis_Exec(std::string const& commandLine, bool option1, bool option2, bool option3) {
+    // Refused before a fault fires, so that a refused call uses up no fault.
+    std::string problem = Host::TextProblem(commandLine);
+    if (!problem.empty()) throw Gantry::Lib::GantryException("Trellis_Exec: the command line " + problem);
     int status = kTrellisExec.FaultStatus();
     kTrellisExec.Write([&](Host::Transaction& t) {
         Host::Store& store = t.GetStore();

@@ -27,7 +27,8 @@ struct Fault {
 
 // Refuses (std::invalid_argument, with a one-line reason) an operation no
 // Operation has registered, a message for Trellis_Exec or a status for any
-// other, a status of 0 and a remaining count below 1.
+// other, a status of 0, a message that is empty, not valid UTF-8 or holds a
+// control character, and a remaining count below 1.
 void CheckFault(const Fault& fault);
 // CheckFault, then arms the fault on the open host.
 void ArmFault(const Fault& fault);

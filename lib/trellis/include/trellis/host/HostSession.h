@@ -15,15 +15,16 @@ public:
 };
 
 // Where the host lives: hostOption (the --host option) when it is not empty,
-// else $HALDEN_HOST, else $XDG_STATE_HOME/halden/host.db, else
-// ~/.local/state/halden/host.db. Throws HostOpenError when none of these is
-// set.
+// else $HALDEN_HOST, else $XDG_STATE_HOME/halden/host.db when that is an
+// absolute path, else ~/.local/state/halden/host.db. Throws HostOpenError
+// when none of these is set.
 std::string ResolveHostPath(const std::string& hostOption);
 
 // Opens the host at path for this process; a host that does not exist yet is
 // created with the default inventory. Every facade and host object made
 // afterwards works on this host. Opening another host closes the previous one.
-// Throws HostOpenError.
+// Throws HostOpenError, also for a path that names a directory ("dir/",
+// "dir/.") before anything is created.
 void OpenHost(const std::string& path);
 
 // Closes the open host, if any.

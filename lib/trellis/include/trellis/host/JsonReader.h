@@ -38,6 +38,8 @@ public:
 
     // The reader's own value.
     void ExpectObject() const;
+    // Every string of the host is valid UTF-8 without control characters;
+    // AsString and the string readers below refuse any other.
     std::string AsString() const;
     // The elements of an array value; an absent value is an empty array.
     std::vector<JsonReader> Elements() const;

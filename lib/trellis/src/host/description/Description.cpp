@@ -1,5 +1,7 @@
 #include "trellis/host/Description.h"
 
+#include <cstdint>
+
 #include <nlohmann/json.hpp>
 
 #include "host/Store.h"
@@ -32,22 +34,12 @@ const Json& DefaultDescription() {
     return description;
 }
 
-Json ParseDescriptionText(const std::string& text) {
-    try {
-        return Json::parse(text);
-    } catch (const nlohmann::json::parse_error& e) {
-        std::string message = e.what();
-        auto end = message.find("] ");  // drop the library's "[json.exception.parse_error.101] "
-        throw DescriptionError("not valid JSON: " +
-                               (end == std::string::npos ? message : message.substr(end + 2)));
-    }
-}
-
 ParsedDescription ParseDescription(const Json& description) {
     JsonReader root(&description, "");
     root.ExpectObject();
     JsonReader format = root.Member(kFormatKey);
-    if (format.Value() != kDescriptionFormat)
+    // Compared as an integer: JSON equality would take 1.0 for 1.
+    if (!format.Value().is_number_integer() || format.Value().get<std::int64_t>() != kDescriptionFormat)
         format.Fail("expected " + std::to_string(kDescriptionFormat) + ", the format this version reads");
     std::vector<ParsedDescription::Entry> sections;
     for (const SectionType& type : SectionTypes()) {
@@ -85,7 +77,12 @@ void WriteSectionOfDefault(Transaction& t, const std::string& key) {
 }
 
 std::string DescriptionText(const Json& description) {
-    return description.dump(2) + "\n";
+    try {
+        return description.dump(2) + "\n";
+    } catch (const nlohmann::json::type_error&) {
+        // Only text stored by an older build that checked less can get here.
+        throw Gantry::Lib::GantryException("The host store holds text that is not valid UTF-8; it cannot be exported");
+    }
 }
 
 std::string ExportHost() {
