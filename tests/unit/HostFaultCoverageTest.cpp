@@ -53,7 +53,7 @@ struct DirectRow {
     std::function<std::string()> seen;
 };
 
-// The operations the unit tests register for themselves (HostTestRecords.h).
+// The operations the unit tests register for themselves, all named "HostTest::...".
 bool IsTestOnly(const std::string& operation) { return operation.rfind("HostTest::", 0) == 0; }
 
 const Words kFirewallGet = {"network", "firewall", "get"};

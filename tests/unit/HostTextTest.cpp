@@ -13,7 +13,7 @@ using namespace Trellis::Host;
 
 namespace {
 
-const Operation kWrite("HostTextTest::Write");
+const Operation kWrite("HostTest::WriteText");
 
 }  // namespace
 
