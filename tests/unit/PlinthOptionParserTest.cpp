@@ -6,7 +6,6 @@
 #include "plinth/callspec/Parameter.h"
 #include "plinth/cli/OptionParser.h"
 #include "plinth/cli/UsageError.h"
-#include "plinth/cli/ValueParser.h"
 
 using namespace Plinth::CallSpec;
 using Plinth::Cli::ParseCommandOptions;

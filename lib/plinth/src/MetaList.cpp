@@ -31,7 +31,6 @@ void MetaList::AddCString(char const* value) {
     elements_.push_back(value ? MetaString::New(value) : MetaString::New());
 }
 void MetaList::AddString(std::string const& value) { elements_.push_back(MetaString::New(value)); }
-void MetaList::AddMetaObject(boost::shared_ptr<MetaObject> value) { elements_.push_back(value); }
 
 MetaType MetaList::GetElementType() const { return elementType_; }
 boost::shared_ptr<MetaObject> MetaList::GetShape() const { return shape_; }

@@ -34,7 +34,6 @@ void MetaStruct::SetField(std::string const& title, boost::shared_ptr<MetaBool> 
 void MetaStruct::SetField(std::string const& title, boost::shared_ptr<MetaInt> value) { Store(title, value); }
 void MetaStruct::SetField(std::string const& title, boost::shared_ptr<MetaList> value) { Store(title, value); }
 void MetaStruct::SetField(std::string const& title, boost::shared_ptr<MetaStruct> value) { Store(title, value); }
-void MetaStruct::SetField(std::string const& title, boost::shared_ptr<MetaObject> value) { Store(title, value); }
 
 void MetaStruct::SetField(std::string const& title, std::string const& value) {
     Store(title, MetaString::New(value));
@@ -48,13 +47,7 @@ void MetaStruct::SetField(std::string const& title, long long value) { Store(tit
 void MetaStruct::SetField(std::string const& title, unsigned int value) {
     Store(title, MetaInt::New(static_cast<long long>(value)));
 }
-void MetaStruct::SetField(std::string const& title, long value) {
-    Store(title, MetaInt::New(static_cast<long long>(value)));
-}
 void MetaStruct::SetField(std::string const& title, unsigned long value) {
-    Store(title, MetaInt::New(static_cast<long long>(value)));
-}
-void MetaStruct::SetField(std::string const& title, unsigned long long value) {
     Store(title, MetaInt::New(static_cast<long long>(value)));
 }
 

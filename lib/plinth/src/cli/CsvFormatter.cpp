@@ -1,7 +1,6 @@
 #include "plinth/cli/Formatters.h"
 #include "plinth/cli/TableRows.h"
 #include "plinth/cli/Utf8.h"
-#include "plinth/cli/ValueText.h"
 
 namespace Plinth {
 namespace Cli {

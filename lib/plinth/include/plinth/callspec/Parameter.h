@@ -45,7 +45,6 @@ public:
     Parameter StringEnum(std::vector<Word> words) const;
     Parameter Regex(std::string pattern) const;
 
-    std::string const& Name() const { return name_; }
     // So that input->GetString(kRulesetId) reads the value by this name.
     operator std::string const&() const { return name_; }
 

@@ -34,9 +34,7 @@ public:
     virtual void AddCString(char const* value);
     virtual void AddString(std::string const& value);
 
-    // Beyond the commands' operations: any value (an int, a bool, a nested
-    // list), and read access for the formatters.
-    void AddMetaObject(boost::shared_ptr<MetaObject> value);
+    // Beyond the commands' operations: read access for the formatters.
     MetaType GetElementType() const;
     // The element shape given to New, or null.
     boost::shared_ptr<MetaObject> GetShape() const;

@@ -45,11 +45,7 @@ public:
     // Beyond the commands' operations: integer types that would otherwise be
     // ambiguous between the int, long long and bool forms. Stored as MetaInt.
     void SetField(std::string const& title, unsigned int value);
-    void SetField(std::string const& title, long value);
     void SetField(std::string const& title, unsigned long value);
-    void SetField(std::string const& title, unsigned long long value);
-    // Any value, for code that holds it through the base.
-    void SetField(std::string const& title, boost::shared_ptr<MetaObject> value);
 
     // Read access for the formatters.
     std::string const& GetName() const;
