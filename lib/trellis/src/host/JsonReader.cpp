@@ -62,10 +62,6 @@ bool JsonReader::Bool(const char* key) const {
     return member.get<bool>();
 }
 
-bool JsonReader::Bool(const char* key, bool fallback) const {
-    return Find(key) ? Bool(key) : fallback;
-}
-
 std::int64_t JsonReader::Int(const char* key, std::int64_t min, std::int64_t max) const {
     const Json& member = Required(key);
     bool inRange = false;
@@ -82,10 +78,6 @@ std::int64_t JsonReader::Int(const char* key, std::int64_t min, std::int64_t max
         JsonReader(&member, PathOf(key))
             .Fail("expected an integer from " + std::to_string(min) + " to " + std::to_string(max));
     return value;
-}
-
-std::int64_t JsonReader::Int(const char* key, std::int64_t min, std::int64_t max, std::int64_t fallback) const {
-    return Find(key) ? Int(key, min, max) : fallback;
 }
 
 std::size_t JsonReader::Word(const char* key, const std::vector<std::string>& words) const {

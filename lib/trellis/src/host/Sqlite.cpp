@@ -73,10 +73,6 @@ int Database::Changes() const {
     return sqlite3_changes(db_);
 }
 
-std::int64_t Database::LastInsertRowId() const {
-    return sqlite3_last_insert_rowid(db_);
-}
-
 bool Database::InTransaction() const {
     return sqlite3_get_autocommit(db_) == 0;
 }

@@ -46,9 +46,7 @@ public:
     std::int64_t QueryInt(const std::string& sql);
     // Rows changed by the last INSERT, UPDATE or DELETE.
     int Changes() const;
-    std::int64_t LastInsertRowId() const;
     bool InTransaction() const;
-    sqlite3* Handle() const { return db_; }
 
     [[noreturn]] void Fail(int code, const std::string& what) const;
 

@@ -49,9 +49,7 @@ public:
     std::string String(const char* key) const;
     std::string String(const char* key, const std::string& fallback) const;
     bool Bool(const char* key) const;
-    bool Bool(const char* key, bool fallback) const;
     std::int64_t Int(const char* key, std::int64_t min, std::int64_t max) const;
-    std::int64_t Int(const char* key, std::int64_t min, std::int64_t max, std::int64_t fallback) const;
     // A string that must be one of words; returns its index.
     std::size_t Word(const char* key, const std::vector<std::string>& words) const;
     // Word as an enum whose values are the indexes of words:

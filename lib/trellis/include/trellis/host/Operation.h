@@ -46,9 +46,6 @@ public:
     // Registers name in the process-wide list of operations.
     explicit Operation(std::string name, FaultKind kind = FaultKind::Message);
 
-    const std::string& Name() const { return name_; }
-    FaultKind Kind() const { return kind_; }
-
     // Throws Gantry::Lib::GantryException with the message of the fault armed
     // for this operation, if any (counting the hit down). Throws
     // GantryException "No host is open" when no host is open.

@@ -40,9 +40,6 @@ public:
     Transaction(const Transaction&) = delete;
     Transaction& operator=(const Transaction&) = delete;
 
-    // Whether this transaction may change the host (Operation::Write).
-    bool IsWrite() const { return write_; }
-
     template <class R>
     std::optional<R> Find(const std::string& name) const {
         std::optional<Json> data = FindData(R::kKind, name);

@@ -20,7 +20,6 @@ public:
     void Write(Transaction& t) const override;
     Json Export(const Transaction& t) const override;
 
-    const std::vector<StandardSwitchRecord>& Switches() const { return switches_; }
     const StandardSwitchRecord* Find(const std::string& name) const;
 
 private:
