@@ -58,11 +58,6 @@ bool IpAddress::Parse(Family family, std::string const& text, Bytes& bytes) {
     return true;
 }
 
-bool IpAddress::IsValidAddress(std::string const& text) {
-    Bytes ignored;
-    return Parse(Family::Ipv4, text, ignored) || Parse(Family::Ipv6, text, ignored);
-}
-
 bool IpAddress::IsUnset() const {
     return AllZero(bytes_.data(), bytes_.data() + bytes_.size());
 }
@@ -80,12 +75,6 @@ std::string IpAddress::GetStringAddress() const {
 
 bool operator==(IpAddress const& a, IpAddress const& b) {
     return a.family_ == b.family_ && a.bytes_ == b.bytes_;
-}
-
-bool operator<(IpAddress const& a, IpAddress const& b) {
-    if (a.family_ != b.family_)
-        return a.family_ == IpAddress::Family::Ipv4;
-    return a.bytes_ < b.bytes_;
 }
 
 }  // namespace Network

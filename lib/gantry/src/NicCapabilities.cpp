@@ -15,11 +15,5 @@ NicCapabilities NicCapabilities::GetDefaultPolicy() {
     return capabilities;
 }
 
-bool operator==(NicCapabilities const& a, NicCapabilities const& b) {
-    return a.checksumOffload == b.checksumOffload &&
-           a.tcpSegmentationOffload == b.tcpSegmentationOffload &&
-           a.scatterGather == b.scatterGather && a.vlanTagOffload == b.vlanTagOffload;
-}
-
 }  // namespace Network
 }  // namespace Gantry

@@ -35,11 +35,5 @@ PortSecurityPolicy PortSecurityPolicy::GetDefaultPolicy() {
     return policy;
 }
 
-bool operator==(PortSecurityPolicy const& a, PortSecurityPolicy const& b) {
-    return a.setMask == b.setMask && a.allowPromiscuous == b.allowPromiscuous &&
-           a.allowMacAddressChange == b.allowMacAddressChange &&
-           a.allowForgedTransmits == b.allowForgedTransmits;
-}
-
 }  // namespace Network
 }  // namespace Gantry

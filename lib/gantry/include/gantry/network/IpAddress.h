@@ -26,10 +26,6 @@ public:
     IpAddress(IpAddress const&) = default;
     IpAddress& operator=(IpAddress const&) = default;
 
-    // Whether the text is an address of either family.
-    static bool IsValidAddress(std::string const& text);
-
-    Family GetFamily() const { return family_; }
     bool IsIpv4() const { return family_ == Family::Ipv4; }
     bool IsIpv6() const { return family_ == Family::Ipv6; }
     // True for the empty value of the family ("0.0.0.0", "::").
@@ -40,11 +36,9 @@ public:
     // IPv4-mapped address).
     std::string GetStringAddress() const;
 
-    // Addresses of different families are never equal; the order puts all
-    // IPv4 addresses before IPv6 ones, then compares the bytes.
+    // Addresses of different families are never equal.
     friend bool operator==(IpAddress const& a, IpAddress const& b);
     friend bool operator!=(IpAddress const& a, IpAddress const& b) { return !(a == b); }
-    friend bool operator<(IpAddress const& a, IpAddress const& b);
 
 protected:
     using Bytes = std::array<std::uint8_t, 16>;

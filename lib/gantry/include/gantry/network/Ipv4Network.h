@@ -32,7 +32,6 @@ public:
 
     Ipv4Address GetNetwork() const { return network_; }
     Ipv4Address GetNetmask() const;
-    unsigned int GetPrefixLength() const { return prefixLength_; }
     // "192.0.2.0/24".
     std::string GetStringAddress() const;
 

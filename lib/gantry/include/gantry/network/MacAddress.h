@@ -28,13 +28,11 @@ public:
 
     // Lower case with colons: "00:50:56:a1:b2:c3".
     std::string GetStringAddress() const;
-    Bytes GetBytes() const { return bytes_; }
     bool IsUnset() const;
     bool IsMulticast() const { return (bytes_[0] & 0x01) != 0; }
 
     friend bool operator==(MacAddress const& a, MacAddress const& b) { return a.bytes_ == b.bytes_; }
     friend bool operator!=(MacAddress const& a, MacAddress const& b) { return !(a == b); }
-    friend bool operator<(MacAddress const& a, MacAddress const& b) { return a.bytes_ < b.bytes_; }
 
 private:
     static bool Parse(std::string const& text, Bytes& bytes);

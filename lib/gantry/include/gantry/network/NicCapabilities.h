@@ -18,8 +18,5 @@ public:
     bool vlanTagOffload;
 };
 
-bool operator==(NicCapabilities const& a, NicCapabilities const& b);
-inline bool operator!=(NicCapabilities const& a, NicCapabilities const& b) { return !(a == b); }
-
 }  // namespace Network
 }  // namespace Gantry

@@ -35,8 +35,5 @@ public:
     bool allowForgedTransmits;
 };
 
-bool operator==(PortSecurityPolicy const& a, PortSecurityPolicy const& b);
-inline bool operator!=(PortSecurityPolicy const& a, PortSecurityPolicy const& b) { return !(a == b); }
-
 }  // namespace Network
 }  // namespace Gantry
