@@ -49,13 +49,6 @@ struct CommandRun {
 
     // The result parsed back, for assertions on single fields.
     nlohmann::ordered_json Parsed() const { return nlohmann::ordered_json::parse(Json()); }
-
-    // The result as the command's default formatter (or the one named) shows it.
-    std::string Text(const Plinth::Cli::Formatter& formatter) const {
-        std::ostringstream out;
-        if (result) formatter.Write(out, result, shape, Plinth::Cli::FormatHints(hints));
-        return out.str();
-    }
 };
 
 template <class CommandClass>
