@@ -6,7 +6,7 @@
 
 #include <nlohmann/json.hpp>
 
-#include "trellis/host/records/SwitchRecords.h"
+#include "trellis/host/records/StoredPolicies.h"
 
 namespace Trellis {
 namespace Host {

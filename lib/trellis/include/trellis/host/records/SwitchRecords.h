@@ -10,10 +10,8 @@
 #include <vector>
 
 #include "gantry/network/CdpStatus.h"
-#include "gantry/network/NicTeamingPolicy.h"
-#include "gantry/network/PortSecurityPolicy.h"
-#include "gantry/network/ShapingPolicy.h"
 #include "trellis/host/JsonReader.h"
+#include "trellis/host/records/StoredPolicies.h"
 
 namespace Trellis {
 namespace Host {
@@ -27,16 +25,6 @@ struct SwitchLimits {
     static constexpr int kMaxPortsPerHost = 4608;  // configured ports, summed over all switches
     static constexpr int kMinMtu = 1280;
     static constexpr int kMaxMtu = 9000;
-};
-
-// The policies stored at one level (a switch or a port group).
-struct StoredPolicies {
-    Gantry::Network::NicTeamingPolicy teaming;
-    Gantry::Network::PortSecurityPolicy security;
-    Gantry::Network::ShapingPolicy shaping;
-
-    Json ToJson() const;
-    static StoredPolicies FromJson(const JsonReader& in);
 };
 
 // A standard switch ("switch0").
