@@ -1,3 +1,5 @@
+#include "host/HostCreation.h"
+
 #include <fcntl.h>
 #include <signal.h>
 #include <stdio.h>

@@ -4,6 +4,7 @@
 
 #include <sqlite3.h>
 
+#include "host/HostCreation.h"
 #include "host/Schema.h"
 #include "trellis/host/HostSession.h"
 #include "trellis/host/Transaction.h"
