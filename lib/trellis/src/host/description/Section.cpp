@@ -1,6 +1,6 @@
-#include <algorithm>
-
 #include "host/description/Section.h"
+
+#include <algorithm>
 
 namespace Trellis {
 namespace Host {
