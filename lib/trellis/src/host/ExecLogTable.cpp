@@ -1,10 +1,13 @@
 #include "host/ExecLogTable.h"
 
+#include <array>
+#include <cstdint>
+#include <string>
+
 #include <nlohmann/json.hpp>
 
+#include "gantry/lib/GantryException.h"
 #include "host/Sqlite.h"
-#include "host/Store.h"
-#include "trellis/host/Transaction.h"
 
 namespace Trellis {
 namespace Host {
@@ -40,14 +43,6 @@ std::vector<ExecEntry> ReadExecEntries(Database& db) {
         entry.status = static_cast<int>(query.Int(2));
         entries.push_back(entry);
     }
-    return entries;
-}
-
-std::vector<ExecEntry> ReadExecLog() {
-    Store& store = CurrentStore();
-    TransactionScope scope(store, false);
-    std::vector<ExecEntry> entries = GuardedSql(store, [&] { return ReadExecEntries(store.Db()); });
-    scope.Commit();
     return entries;
 }
 
