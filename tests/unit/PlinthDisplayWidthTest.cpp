@@ -2,7 +2,7 @@
 // pad and wrap by.
 #include <gtest/gtest.h>
 
-#include "plinth/cli/Utf8.h"
+#include "plinth/cli/CodePointWidth.h"
 
 using Plinth::Cli::DisplayWidth;
 

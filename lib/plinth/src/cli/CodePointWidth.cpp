@@ -4,6 +4,9 @@
 // characters, the conjoining Hangul vowels and finals). Unassigned code
 // points inside a range take the range's width; that only matters for
 // characters a terminal could not draw anyway.
+
+#include "plinth/cli/CodePointWidth.h"
+
 #include <algorithm>
 #include <iterator>
 

@@ -4,9 +4,9 @@
 
 #include <boost/algorithm/string/replace.hpp>
 
+#include "plinth/cli/CodePointWidth.h"
 #include "plinth/cli/Formatter.h"
 #include "plinth/cli/TextLayout.h"
-#include "plinth/cli/Utf8.h"
 
 namespace Plinth {
 namespace Cli {

@@ -2,9 +2,9 @@
 
 #include <boost/algorithm/string/trim.hpp>
 
+#include "plinth/cli/CodePointWidth.h"
 #include "plinth/cli/Formatters.h"
 #include "plinth/cli/TableRows.h"
-#include "plinth/cli/Utf8.h"
 #include "plinth/cli/ValueText.h"
 #include "plinth/metaobj/MetaBool.h"
 #include "plinth/metaobj/MetaList.h"

@@ -2,7 +2,7 @@
 
 #include <sstream>
 
-#include "plinth/cli/Utf8.h"
+#include "plinth/cli/CodePointWidth.h"
 
 namespace Plinth {
 namespace Cli {
