@@ -64,7 +64,6 @@ void BuildDefaultHost(const std::string& temporary) {
         store.Db().Execute("PRAGMA user_version = " + std::to_string(LatestSchemaVersion()));
         scope.Commit();
     }
-    store.Db().Execute("PRAGMA journal_mode = WAL");
 }
 
 class RemoveOnExit {

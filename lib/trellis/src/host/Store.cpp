@@ -64,7 +64,10 @@ std::unique_ptr<Store> Store::Open(const std::string& path) {
     try {
         db->Execute("PRAGMA busy_timeout = " + std::to_string(kBusyTimeoutMs));
         CheckIsHostStore(path, *db);
-        db->Execute("PRAGMA journal_mode = WAL; PRAGMA synchronous = FULL");
+        // A rollback journal, kept as an empty file between changes: reading
+        // the host then writes nothing at all, where a write-ahead log would
+        // create and remove its two files at every open.
+        db->Execute("PRAGMA journal_mode = TRUNCATE; PRAGMA synchronous = FULL");
         store = std::make_unique<Store>(path, std::move(db));
         store->Migrate();
         store->faults_.Reload();
