@@ -1,13 +1,17 @@
-// The tool over an in-memory tree: when the host is opened and when not, and
-// which plug-in files it loads. Formatters, error texts and exit statuses
-// are proven through the binary in tests/cli/frame.test.sh.
+// The tool over an in-memory tree: when the host is opened and when not,
+// which plug-in files it loads, and how a batch runs. Formatters, error
+// texts and exit statuses are proven through the binary in
+// tests/cli/frame.test.sh, a batch's output in tests/cli/batch.test.sh.
 #include <gtest/gtest.h>
+#include <sys/stat.h>
+#include <unistd.h>
 
 #include <cstdlib>
 #include <fstream>
 #include <sstream>
 
 #include "PlinthScriptedCommand.h"
+#include "plinth/cli/BatchReader.h"
 #include "plinth/cli/PluginLoader.h"
 #include "plinth/cli/Tool.h"
 
@@ -52,6 +56,22 @@ protected:
     std::ostringstream err_;
     std::vector<std::string> hostsOpened_;
 };
+
+// A body for batches: prints the ruleset's name; "fail" reports an error,
+// "throw" throws.
+void NameOrFailure(Input& input, Output& output) {
+    std::string const name = input.GetString("ruleset-id");
+    if (name == "throw") throw std::runtime_error("Thrown");
+    if (name == "fail") return output.SetError("Failed");
+    output.SetResult(MetaString::New(name));
+    output.Finish();
+}
+
+std::string BatchFile(std::string const& text) {
+    std::string const path = ::testing::TempDir() + "/plinth-batch.txt";
+    std::ofstream(path, std::ios::binary) << text;
+    return path;
+}
 
 }  // namespace
 
@@ -138,4 +158,77 @@ TEST_F(PlinthTool, AnExceptionThatEscapesACommandIsOneLineAndStatusOne) {
     command_->inputSpec = []() -> boost::shared_ptr<InputSpec> { throw std::bad_alloc(); };
     EXPECT_EQ(1, Run({"--help", "network", "ruleset", "get"}));
     EXPECT_EQ("std::bad_alloc\n", err_.str());
+}
+
+TEST_F(PlinthTool, ABatchStopsAtTheFirstFailingLineUnlessForced) {
+    command_->body = NameOrFailure;
+    std::string const file = BatchFile(
+        "# rulesets\n"
+        "\n"
+        "network ruleset get -r dns\n"
+        "network ruleset get -r fail\n"
+        "network ruleset get -r throw\n"
+        "network ruleset get -r 'a\n"
+        "network ruleset get -r \"dns server\"\n");
+    EXPECT_EQ(1, Run({"--batch", file}));
+    EXPECT_EQ("dns\n", out_.str());
+    EXPECT_EQ("Failed\nhaldencli: batch stopped at line 4 (status 1).\n", err_.str());
+
+    EXPECT_EQ(2, Run({"--force", "--batch", file}));  // the worst status
+    EXPECT_EQ("dns\ndns server\n", out_.str());
+    EXPECT_EQ("Failed\nThrown\nError: Batch line 6: the single quote is not closed.\n", err_.str());
+}
+
+TEST_F(PlinthTool, EveryLineOfABatchWorksOnItsHostOpenedOnce) {
+    command_->body = NameOrFailure;
+    std::string const file = BatchFile(
+        "network ruleset get -r a\n"
+        "--host /other.db network ruleset get -r b\n"
+        "--batch other.txt\n"
+        "network ruleset get -r c\n");
+    EXPECT_EQ(2, Run({"--host=/tmp/h.db", "--batch", file, "--force"}));
+    EXPECT_EQ("a\nc\n", out_.str());
+    EXPECT_EQ(
+        "Error: Batch line 2: --host cannot be given on a line of a batch; give it before --batch.\n"
+        "Error: Batch line 3: --batch cannot be given on a line of a batch.\n",
+        err_.str());
+    EXPECT_EQ(std::vector<std::string>{"/tmp/h.db"}, hostsOpened_);
+}
+
+TEST_F(PlinthTool, BatchLinesAreCheckedAsTheyAreRead) {
+    command_->body = NameOrFailure;
+    EXPECT_EQ(0, Run({"--batch", BatchFile("\n  # nothing to run\n")}));
+    EXPECT_EQ("", out_.str() + err_.str());
+    EXPECT_TRUE(hostsOpened_.empty());
+
+    std::string const longLine = "network ruleset get -r " + std::string(Plinth::Cli::kMaxBatchLineBytes, 'x');
+    EXPECT_EQ(2, Run({"--force", "--batch",
+                      BatchFile("network ruleset get -r caf\xE9\r\n" + longLine +
+                                "\n\r\nnetwork ruleset get -r dos\r\nnetwork ruleset get -r last")}));
+    EXPECT_EQ("dos\nlast\n", out_.str());
+    EXPECT_EQ("Error: Batch line 1: it is not valid UTF-8.\nError: Batch line 2: it is longer than 1 MiB.\n",
+              err_.str());
+}
+
+TEST_F(PlinthTool, ABatchThatCannotBeReadRunsNothing) {
+    std::string const dir = ::testing::TempDir() + "/plinth-batch-input";
+    std::system(("rm -rf " + dir + " && mkdir -p " + dir).c_str());
+    ASSERT_EQ(0, ::mkfifo((dir + "/fifo").c_str(), 0600));
+    std::ofstream(dir + "/big").close();
+    ASSERT_EQ(0, ::truncate((dir + "/big").c_str(), static_cast<off_t>(Plinth::Cli::kMaxBatchBytes + 1)));
+
+    EXPECT_EQ(2, Run({"--batch", dir}));
+    EXPECT_EQ("Error: Cannot read the batch file " + dir + ": it is a directory, not a regular file.\n", err_.str());
+    EXPECT_EQ(2, Run({"--batch", dir + "/fifo"}));  // without waiting for a writer
+    EXPECT_EQ("Error: Cannot read the batch file " + dir + "/fifo: it is a FIFO, not a regular file.\n", err_.str());
+    EXPECT_EQ(2, Run({"--batch", dir + "/big"}));
+    EXPECT_EQ("Error: Cannot read the batch file " + dir + "/big: it is larger than 64 MiB.\n", err_.str());
+    EXPECT_EQ(2, Run({"--batch", dir + "/big", "network", "ruleset"}));
+    EXPECT_EQ(0u, err_.str().find("Error: Unexpected argument 'network': --batch takes its command lines from "
+                                  "the file.\n"));
+    EXPECT_EQ(2, Run({"--force", "network", "ruleset", "get", "-r", "dns"}));
+    EXPECT_EQ(0u, err_.str().find("Error: Option --force is only valid with --batch.\n"));
+    EXPECT_EQ("", out_.str());
+    EXPECT_TRUE(hostsOpened_.empty());
+    std::system(("rm -rf " + dir).c_str());
 }

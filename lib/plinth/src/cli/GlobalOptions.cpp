@@ -29,22 +29,44 @@ bool ReadValueOption(std::string const& name, std::vector<std::string> const& wo
     return true;
 }
 
+// The command lines of a batch come from its lines, each with its own
+// formatter.
+void CheckBatchOptions(GlobalOptions const& options) {
+    if (options.batch.empty()) {
+        if (options.force) throw UsageError("Option --force is only valid with --batch.");
+        return;
+    }
+    if (!options.formatter.empty()) {
+        throw UsageError("Option --formatter cannot be combined with --batch; give it on the batch's lines.");
+    }
+    if (!options.help && !options.commandWords.empty()) {
+        throw UsageError("Unexpected argument '" + VisibleText(options.commandWords.front()) +
+                         "': --batch takes its command lines from the file.");
+    }
+}
+
 }  // namespace
 
 GlobalOptions ParseGlobalOptions(std::vector<std::string> const& words) {
     GlobalOptions options;
     bool hostSeen = false;
     bool formatterSeen = false;
+    bool batchSeen = false;
     size_t i = 0;
     for (; i < words.size() && !words[i].empty() && words[i][0] == '-'; ++i) {
         if (words[i] == "--help") {
             options.help = true;
+        } else if (words[i] == "--force") {
+            if (options.force) throw UsageError("Option --force was given more than once.");
+            options.force = true;
         } else if (!ReadValueOption("host", words, i, options.host, hostSeen) &&
-                   !ReadValueOption("formatter", words, i, options.formatter, formatterSeen)) {
+                   !ReadValueOption("formatter", words, i, options.formatter, formatterSeen) &&
+                   !ReadValueOption("batch", words, i, options.batch, batchSeen)) {
             throw UsageError("Unknown option " + VisibleText(words[i]) + ".");
         }
     }
     options.commandWords.assign(words.begin() + static_cast<long>(i), words.end());
+    CheckBatchOptions(options);
     return options;
 }
 

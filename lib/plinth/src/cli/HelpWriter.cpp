@@ -66,6 +66,12 @@ std::string GlobalOptions() {
     std::string formatters;
     for (std::string const& name : FormatterNames()) formatters += (formatters.empty() ? "" : ", ") + name;
     return "Options:\n" +
+           FormatColumns("--batch=<str>",
+                         "Run the command lines of a file (- for standard input), one a line, on one host; "
+                         "stop at the first that fails.",
+                         2, kOptionColumn, kWidth) +
+           FormatColumns("--force", "With --batch: run every line, even after one fails.", 2, kOptionColumn,
+                         kWidth) +
            FormatColumns("--formatter=<str>",
                          "The output format: " + formatters + ". The default is the command's own.", 2,
                          kOptionColumn, kWidth) +

@@ -2,7 +2,10 @@
 
 #include <algorithm>
 #include <list>
+#include <memory>
 
+#include "plinth/cli/Batch.h"
+#include "plinth/cli/BatchLine.h"
 #include "plinth/cli/FormatHints.h"
 #include "plinth/cli/Formatter.h"
 #include "plinth/cli/OptionParser.h"
@@ -38,14 +41,14 @@ std::string AvailableFormatters() {
     return names;
 }
 
-}  // namespace
-
-Tool::Tool(boost::shared_ptr<NamespaceNode> root, std::string programName, HostOpener openHost)
-    : root_(root), help_(std::move(programName)), openHost_(std::move(openHost)) {}
-
-int Tool::Run(std::vector<std::string> const& words, std::ostream& out, std::ostream& err) {
+// The status of run(); an exception that escapes it is reported as one line,
+// with status 1. A batch line's refusal passes through to the batch.
+template <typename Run>
+int Guarded(std::ostream& err, Run const& run) {
     try {
-        return RunWords(words, out, err);
+        return run();
+    } catch (BatchLineError const&) {
+        throw;
     } catch (std::exception const& failure) {
         err << OneLine(failure.what()) << "\n";
     } catch (...) {
@@ -54,7 +57,17 @@ int Tool::Run(std::vector<std::string> const& words, std::ostream& out, std::ost
     return EXIT_FAILED;
 }
 
-int Tool::RunWords(std::vector<std::string> const& words, std::ostream& out, std::ostream& err) {
+}  // namespace
+
+Tool::Tool(boost::shared_ptr<NamespaceNode> root, std::string programName, HostOpener openHost)
+    : root_(root), programName_(programName), help_(programName), openHost_(std::move(openHost)) {}
+
+int Tool::Run(std::vector<std::string> const& words, std::ostream& out, std::ostream& err) {
+    return Guarded(err, [&] { return RunWords(words, out, err, nullptr); });
+}
+
+int Tool::RunWords(std::vector<std::string> const& words, std::ostream& out, std::ostream& err,
+                   std::string const* batchHost) {
     GlobalOptions options;
     try {
         options = ParseGlobalOptions(words);
@@ -62,6 +75,33 @@ int Tool::RunWords(std::vector<std::string> const& words, std::ostream& out, std
         err << "Error: " << refusal.what() << "\n\n" << help_.NamespaceHelp(*root_);
         return EXIT_REFUSED;
     }
+    if (batchHost) {
+        if (!options.batch.empty()) throw BatchLineError("--batch cannot be given on a line of a batch");
+        if (!options.host.empty()) {
+            throw BatchLineError("--host cannot be given on a line of a batch; give it before --batch");
+        }
+        options.host = *batchHost;
+    } else if (!options.batch.empty() && !options.help) {
+        return RunBatchFile(options, out, err);
+    }
+    return RunPath(options, out, err);
+}
+
+int Tool::RunBatchFile(GlobalOptions const& options, std::ostream& out, std::ostream& err) {
+    std::unique_ptr<BatchReader> reader;
+    try {
+        reader.reset(new BatchReader(options.batch));
+    } catch (BatchInputError const& refusal) {
+        err << "Error: " << refusal.what() << ".\n";
+        return EXIT_REFUSED;
+    }
+    BatchLineRunner const runLine = [&](std::vector<std::string> const& words) {
+        return Guarded(err, [&] { return RunWords(words, out, err, &options.host); });
+    };
+    return RunBatch(*reader, options.force, runLine, programName_, out, err);
+}
+
+int Tool::RunPath(GlobalOptions const& options, std::ostream& out, std::ostream& err) {
     if (!options.formatter.empty() && !MakeFormatter(options.formatter)) {
         err << "Error: Unknown formatter '" << VisibleText(options.formatter)
             << "'. Available formatters: " << AvailableFormatters() << ".\n";

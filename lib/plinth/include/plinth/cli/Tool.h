@@ -36,10 +36,19 @@ public:
     // help to out, error texts and refusals to err; returns the exit status.
     // An exception that escapes a command or the tool itself is reported as
     // one line, with status 1.
+    //
+    // With --batch FILE the command lines come from the file, one a line
+    // (see RunBatch), all run by this Tool on the host opened once for the
+    // first line that needs it. A line may not carry --host or --batch.
     int Run(std::vector<std::string> const& words, std::ostream& out, std::ostream& err);
 
 private:
-    int RunWords(std::vector<std::string> const& words, std::ostream& out, std::ostream& err);
+    // batchHost: the --host of the batch the words are a line of; null for
+    // the words of the command line itself.
+    int RunWords(std::vector<std::string> const& words, std::ostream& out, std::ostream& err,
+                 std::string const* batchHost);
+    int RunPath(GlobalOptions const& options, std::ostream& out, std::ostream& err);
+    int RunBatchFile(GlobalOptions const& options, std::ostream& out, std::ostream& err);
     int RunCommand(AutoCli::Command& command, GlobalOptions const& options, std::vector<std::string> const& words,
                    std::ostream& out, std::ostream& err);
     int ShowCommandHelp(AutoCli::Command& command, GlobalOptions const& options, std::ostream& out,
@@ -50,6 +59,7 @@ private:
     void OpenHostOnce(GlobalOptions const& options);
 
     boost::shared_ptr<AutoCli::NamespaceNode> root_;
+    std::string programName_;
     HelpWriter help_;
     HostOpener openHost_;
     bool hostOpen_ = false;
