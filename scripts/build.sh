@@ -47,7 +47,7 @@ flock 9
 sources_changed || exit 0
 
 packages=(g++ cmake ninja-build pkg-config libboost-dev libboost-regex-dev
-          libsqlite3-dev nlohmann-json3-dev libgtest-dev)
+          libsqlite3-dev nlohmann-json3-dev libgtest-dev libbenchmark-dev)
 missing=()
 for p in "${packages[@]}"; do
   dpkg-query -W -f='${Status}' "$p" 2>/dev/null | grep -q 'ok installed' || missing+=("$p")

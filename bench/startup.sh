@@ -1,0 +1,47 @@
+#!/usr/bin/env bash
+# What each command costs, start-up included, against the floor: a C++
+# program that loads one shared library and calls one function. Every
+# command of the tree runs on the default host, each run paired with a run of
+# the floor just before it; the goal is at most 1.5 times the floor's wall
+# time for every command.
+#
+#   bench/startup.sh [ROUNDS]      (default 200)
+. "$(dirname "${BASH_SOURCE[0]}")/lib.sh"
+bench_setup
+rounds=${1:-200}
+host="$work/host.db"
+bench_host "$host"
+c="$cli --host $host"
+
+# One round leaves the host as it found it: what a line adds, a later line
+# removes again.
+"$paired" "$rounds" "$floor" <<LINES | awk -F'\t' '
+  BEGIN { printf "%8s %8s %6s %6s  %s\n", "floor us", "cmd us", "wall", "cpu", "command"; worst = 0 }
+  { sub(/.*--host [^ ]* /, "", $5); printf "%8d %8d %6.2f %6.2f  %s\n", $1, $2, $3, $4, $5
+    if ($3 > worst) { worst = $3; which = $5 } }
+  END { printf "worst wall ratio %.2f (%s); goal: at most 1.50\n", worst, which }'
+$c network --help
+$c network firewall get
+$c network firewall set -e true
+$c network firewall refresh
+$c network firewall ruleset list
+$c network firewall ruleset list -r dns
+$c network firewall ruleset set -r dns -e true
+$c network firewall ruleset rule list -r dns
+$c network firewall ruleset allowedip list
+$c network firewall ruleset allowedip add -r sshClient -i 192.0.2.7
+$c network firewall ruleset allowedip remove -r sshClient -i 192.0.2.7
+$c network vswitch standard list
+$c network vswitch standard list -v switch0
+$c network vswitch standard add -v bench0
+$c network vswitch standard set -v bench0 -m 9000 -c both
+$c network vswitch standard uplink add -v bench0 -u pnet1
+$c network vswitch standard uplink remove -v bench0 -u pnet1
+$c network vswitch standard portgroup add -p BenchGroup -v bench0
+$c network vswitch standard portgroup set -p BenchGroup -v 10
+$c network vswitch standard portgroup list
+$c network vswitch standard portgroup remove -p BenchGroup -v bench0
+$c network vswitch standard remove -v bench0
+$c network firewall unload
+$c network firewall load
+LINES
