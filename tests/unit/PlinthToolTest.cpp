@@ -232,3 +232,26 @@ TEST_F(PlinthTool, ABatchThatCannotBeReadRunsNothing) {
     EXPECT_TRUE(hostsOpened_.empty());
     std::system(("rm -rf " + dir).c_str());
 }
+
+TEST(PlinthToolHostHold, EachCommandRunsBetweenHoldAndReleaseAndAFailedHoldRunsNothing) {
+    boost::shared_ptr<Namespace> root = Namespace::New();
+    boost::shared_ptr<ScriptedCommand> command = ScriptedCommand::New();
+    root->SubNamespace("demo")->RegisterNamespaceNode(command, "run");
+    std::vector<std::string> events;
+    command->body = [&events](Input&, Output&) {
+        events.push_back("run");
+        throw std::runtime_error("broken");
+    };
+    Tool tool(root, "haldencli", [](std::string const&) {});
+    tool.SetHostHold([&events] { events.push_back("hold"); }, [&events] { events.push_back("release"); });
+    std::ostringstream out, err;
+    EXPECT_EQ(1, tool.Run({"demo", "run"}, out, err));
+    EXPECT_EQ((std::vector<std::string>{"hold", "run", "release"}), events);
+
+    events.clear();
+    tool.SetHostHold([] { throw std::runtime_error("The host is busy"); }, [&events] { events.push_back("release"); });
+    err.str("");
+    EXPECT_EQ(1, tool.Run({"demo", "run"}, out, err));
+    EXPECT_EQ("The host is busy\n", err.str());
+    EXPECT_TRUE(events.empty());
+}

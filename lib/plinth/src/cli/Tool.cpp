@@ -29,6 +29,26 @@ struct HostUnavailable {
 
 char const* const kUnknownException = "The command failed with an unknown exception.";
 
+// Holds the host for the life of the object.
+class HostHeld {
+public:
+    HostHeld(std::function<void()> const& hold, std::function<void()> const& release) : release_(release) {
+        if (hold) hold();
+    }
+    ~HostHeld() {
+        try {
+            if (release_) release_();
+        } catch (...) {
+            // Ending the process or the next hold releases the host anyway.
+        }
+    }
+    HostHeld(HostHeld const&) = delete;
+    HostHeld& operator=(HostHeld const&) = delete;
+
+private:
+    std::function<void()> const& release_;
+};
+
 // An exception's text as the one line that reports it.
 std::string OneLine(std::string const& text) {
     if (text.empty()) return kUnknownException;
@@ -134,6 +154,11 @@ int Tool::RunPath(GlobalOptions const& options, std::ostream& out, std::ostream&
     }
 }
 
+void Tool::SetHostHold(std::function<void()> hold, std::function<void()> release) {
+    holdHost_ = std::move(hold);
+    releaseHost_ = std::move(release);
+}
+
 void Tool::OpenHostOnce(GlobalOptions const& options) {
     if (hostOpen_) return;
     try {
@@ -188,6 +213,7 @@ int Tool::RunCommand(Command& command, GlobalOptions const& options, std::vector
     boost::shared_ptr<Output> output = Output::New();
     std::string escaped;
     try {
+        HostHeld held(holdHost_, releaseHost_);
         command.Execute(input, output);
     } catch (std::exception const& failure) {
         escaped = OneLine(failure.what());

@@ -32,6 +32,12 @@ public:
 
     Tool(boost::shared_ptr<AutoCli::NamespaceNode> root, std::string programName, HostOpener openHost);
 
+    // Brackets the run of each command on the open host: hold before it,
+    // release after it, also when it throws. The host's side may use it to
+    // keep the host to the command while it runs. A hold that throws fails
+    // the command (status 1) before it runs.
+    void SetHostHold(std::function<void()> hold, std::function<void()> release);
+
     // words: the command line after the program name. Writes the result and
     // help to out, error texts and refusals to err; returns the exit status.
     // An exception that escapes a command or the tool itself is reported as
@@ -62,6 +68,8 @@ private:
     std::string programName_;
     HelpWriter help_;
     HostOpener openHost_;
+    std::function<void()> holdHost_;
+    std::function<void()> releaseHost_;
     bool hostOpen_ = false;
 };
 
