@@ -23,6 +23,8 @@
 #include "trellis/host/HostSession.h"
 #include "trellis/host/records/FirewallRecords.h"
 #include "trellis/host/records/ModuleRecord.h"
+#include "trellis/host/records/PortRecord.h"
+#include "trellis/host/records/SwitchRecords.h"
 
 using namespace Trellis::Host;
 
@@ -47,6 +49,17 @@ void RunSql(const std::string& path, const std::string& sql) {
     sqlite3_free(error);
     sqlite3_close(db);
     ASSERT_EQ(rc, SQLITE_OK) << message;
+}
+
+std::int64_t QueryInt(const std::string& path, const std::string& sql) {
+    sqlite3* db = nullptr;
+    sqlite3_open(path.c_str(), &db);
+    sqlite3_stmt* stmt = nullptr;
+    sqlite3_prepare_v2(db, sql.c_str(), -1, &stmt, nullptr);
+    std::int64_t value = sqlite3_step(stmt) == SQLITE_ROW ? sqlite3_column_int64(stmt, 0) : -1;
+    sqlite3_finalize(stmt);
+    sqlite3_close(db);
+    return value;
 }
 
 const Operation kPutMany("HostTest::PutMany");
@@ -138,6 +151,31 @@ TEST(HostStore, MigratesAnOlderStoreInOneStep) {
     const Operation count("HostTest::CountRulesets");
     EXPECT_EQ(count.Read([](Transaction& t) { return t.Count<FirewallRulesetRecord>(); }),
               DefaultRulesetNames().size());
+}
+
+TEST(HostStore, AStoreWithoutParentsGetsTheParentOfEveryPortGroupAndPort) {
+    TempHost host;
+    ImportScaledDefaultHost(3);
+    const std::string before = ExportHost();
+    CloseHost();
+    // The layout of version 3: records without the parent column and its index.
+    RunSql(host.Path(), "DROP INDEX records_by_parent; ALTER TABLE records DROP COLUMN parent; PRAGMA user_version = 3");
+
+    host.Reopen();
+    EXPECT_EQ(ExportHost(), before);
+    const Operation read("HostTest::ReadChildren");
+    read.Read([](Transaction& t) {
+        std::vector<std::string> groups;
+        for (const PortGroupRecord& group : t.ChildrenOf<PortGroupRecord>("switch1")) groups.push_back(group.name);
+        EXPECT_EQ(groups, (std::vector<std::string>{"Host Management-1", "Guest Network-1"}));
+        EXPECT_EQ(t.CountChildrenOf<PortRecord>("switch2"), 2u);
+    });
+    CloseHost();
+    // Exactly the records that have a parent got one.
+    EXPECT_EQ(QueryInt(host.Path(), "SELECT count(*) FROM records"
+                                    " WHERE (kind IN ('vswitch.portGroup', 'port')) = (parent IS NULL)"),
+              0);
+    EXPECT_EQ(QueryInt(host.Path(), "PRAGMA user_version"), LatestSchemaVersion());
 }
 
 TEST(HostStore, ConcurrentWritersLoseNoUpdate) {
