@@ -2,6 +2,7 @@
 // the host keeps, and how it resolves the policies in force. The refusals the
 // commands pass on are proven in tests/cli/vswitch.test.sh.
 
+#include <algorithm>
 #include <functional>
 #include <memory>
 #include <string>
@@ -17,6 +18,8 @@
 #include "trellis/host/Description.h"
 #include "trellis/host/HostSession.h"
 #include "trellis/host/JsonReader.h"
+#include "util/OwnedVector"
+#include "trellis/network/PortGroupImpl.h"
 #include "trellis/network/PortsetImpl.h"
 #include "trellis/network/VirtualSwitchImpl.h"
 #include "trellis/network/VirtualSwitchInfoImpl.h"
@@ -77,6 +80,45 @@ TEST(SwitchHost, ARemovedSwitchGoesWithItsGroupsAndFreesItsUplinks) {
     EXPECT_EQ(GroupNamed("Storage"), nullptr);
     SwitchNamed("switch0")->AddUplink("pnet1");  // free again
     EXPECT_EQ(Switch("switch0")["uplinks"], Json({"pnet0", "pnet1"}));
+}
+
+TEST(SwitchHost, GroupsAndPortsCountOnTheirOwnSwitchThroughAddsAndRemoves) {
+    TempHost host;
+    Trellis::Host::ImportScaledDefaultHost(3);
+    auto groupsOf = [](const std::string& vswitch) {
+        Trellis::Util::OwnedVector<Gantry::Network::PortGroup> groups(SwitchNamed(vswitch)->GetPortGroups());
+        Names names;
+        for (Gantry::Network::PortGroup* group : groups) names.push_back(group->GetName());
+        return names;
+    };
+    auto activeClients = [](const std::string& group) {
+        return dynamic_cast<Trellis::Network::PortGroupImpl&>(*GroupNamed(group)).GetActiveClients();
+    };
+    EXPECT_EQ(groupsOf("switch1"), Names({"Host Management-1", "Guest Network-1"}));
+    EXPECT_EQ(SwitchNamed("switch1")->GetUsedPorts(), 3);  // an uplink and two clients
+    EXPECT_EQ(activeClients("Guest Network-1"), 1);
+
+    delete SwitchNamed("switch1")->AddPortGroup("Extra");
+    EXPECT_EQ(groupsOf("switch1"), Names({"Host Management-1", "Guest Network-1", "Extra"}));
+    EXPECT_EQ(groupsOf("switch2"), Names({"Host Management-2", "Guest Network-2"}));
+    EXPECT_EQ(activeClients("Extra"), 0);
+    SwitchNamed("switch1")->RemovePortGroup("Extra");
+    EXPECT_EQ(groupsOf("switch1"), Names({"Host Management-1", "Guest Network-1"}));
+
+    // Without its ports, switch2 can go, and a new switch of its name has no groups.
+    VirtualSwitchInfoImpl info;
+    EXPECT_EQ(FailureOf([&] { info.RemoveVirtualSwitch("switch2"); }),
+              "Unable to remove virtual switch switch2: its port group Host Management-2 has active clients");
+    Json description = Json::parse(Trellis::Host::ExportHost());
+    Json& ports = description["ports"];
+    ports.erase(std::remove_if(ports.begin(), ports.end(), [](const Json& p) { return p["portset"] == "switch2"; }),
+                ports.end());
+    Trellis::Host::ImportHost(description.dump());
+    EXPECT_EQ(SwitchNamed("switch2")->GetUsedPorts(), 1);
+    info.RemoveVirtualSwitch("switch2");
+    AddSwitch("switch2", 8);
+    EXPECT_EQ(groupsOf("switch2"), Names());
+    EXPECT_EQ(SwitchNamed("switch1")->GetUsedPorts(), 3);
 }
 
 TEST(SwitchHost, AnUplinkTakesAPortOfTheSwitch) {
