@@ -108,18 +108,13 @@ expect_stdout "$(cat "$DEFAULT_HOST")"
 sim init --empty --from "$WORK/pass.json"
 expect_status 2
 
-check "init --scale makes a host N times the default's size, whose export imports again"
+check "init --scale makes a host N times the default's size; a bad scale changes nothing"
 sim init --scale 4
 expect_status 0
 cli network vswitch standard portgroup list
 expect_stdout_matches "Guest Network-3 +switch3 +1 +0"
 sim export
 scaled=$OUT
-printf '%s\n' "$scaled" >"$WORK/scaled.json"
-sim import "$WORK/scaled.json"
-expect_status 0
-sim export
-expect_stdout "$scaled"
 for args in "--scale 0" "--scale 1001" "--scale x" "--scale 2 --empty" "--from $WORK/pass.json --scale 2"; do
   sim init $args
   expect_status 2

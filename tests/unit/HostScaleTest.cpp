@@ -2,7 +2,6 @@
 // copied and how it is named, that every copy's references resolve within it
 // (its export imports again), and that the host's port limit holds.
 
-#include <map>
 #include <stdexcept>
 #include <string>
 
@@ -18,26 +17,10 @@ using Json = TempHost::Json;
 
 namespace {
 
-Json ExportedHost() { return Json::parse(ExportHost()); }
-
 const Json& Named(const Json& entries, const std::string& name) {
     for (const Json& entry : entries)
         if (entry["name"] == name) return entry;
     throw std::out_of_range("nothing named " + name);
-}
-
-int ConfiguredPorts(const Json& host) {
-    int total = 0;
-    for (const Json& vswitch : host["standardSwitches"]) total += vswitch["numPorts"].get<int>();
-    return total;
-}
-
-// The client ports on each switch, plus its uplinks.
-std::map<std::string, int> UsedPorts(const Json& host) {
-    std::map<std::string, int> used;
-    for (const Json& vswitch : host["standardSwitches"]) used[vswitch["name"]] = vswitch["uplinks"].size();
-    for (const Json& port : host["ports"]) ++used[port["portset"]];
-    return used;
 }
 
 }  // namespace
@@ -55,7 +38,7 @@ TEST(HostScale, ScaleOneIsTheDefaultHostAndAScaleOutsideTheRangeChangesNothing) 
 TEST(HostScale, EachCopyIsTheDefaultHostRenamedWithItsReferencesWithinIt) {
     TempHost host;
     ImportScaledDefaultHost(3);
-    const Json scaled = ExportedHost();
+    const Json scaled = Json::parse(ExportHost());
     const Json original = Json::parse(kDefaultHostDescription);
 
     EXPECT_EQ(scaled["modules"], original["modules"]);
@@ -89,34 +72,29 @@ TEST(HostScale, EachCopyIsTheDefaultHostRenamedWithItsReferencesWithinIt) {
     EXPECT_EQ(ExportHost(), exported);
 }
 
+// ParseDescription refuses more than 4608 configured ports in all and a
+// switch with more ports in use than it has.
 TEST(HostScale, TheLargestHostKeepsThePortLimitAndEverySwitchItsUsedPorts) {
     const Json scaled = ScaledDescription(DefaultDescription(), kMaxHostScale);
     ParseDescription(scaled);
     EXPECT_EQ(scaled["standardSwitches"].size(), static_cast<std::size_t>(kMaxHostScale));
     EXPECT_EQ(Named(scaled["standardSwitches"], "switch0")["numPorts"], 128);
-    EXPECT_LE(ConfiguredPorts(scaled), 4608);
-    std::map<std::string, int> used = UsedPorts(scaled);
-    for (const Json& vswitch : scaled["standardSwitches"])
-        EXPECT_GE(vswitch["numPorts"], used[vswitch["name"]]) << vswitch["name"];
 }
 
 TEST(HostScale, ASwitchThatUsesMoreThanItsShareKeepsWhatItUses) {
     // switch0 takes nearly all of the host's ports; busy has 30 of its 40 in use.
     Json original = Json::parse(TempHost::Edited([](Json& d) {
         d["standardSwitches"][0]["numPorts"] = 4096;
-        d["standardSwitches"].push_back(d["standardSwitches"][0]);
-        d["standardSwitches"][1]["name"] = "busy";
-        d["standardSwitches"][1]["numPorts"] = 40;
-        d["standardSwitches"][1]["uplinks"] = Json::array();
-        d["standardSwitches"][1]["policy"]["teaming"]["uplinkOrder"] = Json::array();
+        d["standardSwitches"].push_back({{"name", "busy"}, {"numPorts", 40}, {"mtu", 1500}, {"cdpStatus", "listen"},
+                                         {"beacon", {{"enabled", false}, {"interval", 1}, {"threshold", 3}}},
+                                         {"uplinks", Json::array()}});
         d["portGroups"].push_back({{"name", "Crowd"}, {"vswitch", "busy"}, {"vlanId", 0}});
         for (int i = 0; i < 30; ++i)
             d["ports"].push_back({{"id", 100 + i}, {"portset", "busy"}, {"portGroup", "Crowd"},
                                   {"clientKind", "vmAdapter"}, {"clientName", "vm" + std::to_string(i) + ".eth0"}});
     }));
     Json scaled = ScaledDescription(original, 5);
-    ParseDescription(scaled);  // the limits of every imported host hold
-    EXPECT_LE(ConfiguredPorts(scaled), 4608);
+    ParseDescription(scaled);
     EXPECT_EQ(Named(scaled["standardSwitches"], "busy-4")["numPorts"], 30);
     EXPECT_GT(Named(scaled["standardSwitches"], "switch4")["numPorts"], 3);
 }

@@ -12,7 +12,6 @@
 #include "trellis/host/records/SwitchRecords.h"
 
 using namespace Trellis::Host;
-using Json = TempHost::Json;
 
 namespace {
 
@@ -21,6 +20,13 @@ const Operation kRead("HostTest::Read");
 
 std::vector<std::string> CounterNames() {
     return kRead.Read([](Transaction& t) { return t.Names<CounterRecord>(); });
+}
+
+PortGroupRecord GroupOn(const std::string& vswitch, const std::string& name) {
+    PortGroupRecord group;
+    group.name = name;
+    group.vswitch = vswitch;
+    return group;
 }
 
 struct Unrelated {
@@ -60,13 +66,7 @@ TEST(HostTransaction, RecordsKeepTheirPlaceAndKindsStaySeparate) {
 }
 
 TEST(HostTransaction, ChildrenFollowTheirParentThroughPutAndErase) {
-    TempHost host([](Json& d) { d["portGroups"] = Json::array(); d["ports"] = Json::array(); });
-    auto group = [](const char* name, const char* vswitch) {
-        PortGroupRecord record;
-        record.name = name;
-        record.vswitch = vswitch;
-        return record;
-    };
+    TempHost host;
     auto childrenOf = [](const char* parent) {
         return kRead.Read([&](Transaction& t) {
             std::vector<std::string> names;
@@ -75,14 +75,14 @@ TEST(HostTransaction, ChildrenFollowTheirParentThroughPutAndErase) {
             return names;
         });
     };
-    kWrite.Write([&](Transaction& t) {
-        for (const PortGroupRecord& record : {group("g1", "a"), group("g2", "b"), group("g3", "a")}) t.Put(record);
+    kWrite.Write([](Transaction& t) {
+        for (const PortGroupRecord& record : {GroupOn("a", "g1"), GroupOn("b", "g2"), GroupOn("a", "g3")}) t.Put(record);
     });
     EXPECT_EQ(childrenOf("a"), (std::vector<std::string>{"g1", "g3"}));
-    kWrite.Write([&](Transaction& t) { t.Put(group("g1", "b")); });  // replaced in place, with its new parent
+    kWrite.Write([](Transaction& t) { t.Put(GroupOn("b", "g1")); });  // in place, with its new parent
     EXPECT_EQ(childrenOf("a"), (std::vector<std::string>{"g3"}));
     EXPECT_EQ(childrenOf("b"), (std::vector<std::string>{"g1", "g2"}));
-    kWrite.Write([&](Transaction& t) { t.Erase<PortGroupRecord>("g3"); });
+    kWrite.Write([](Transaction& t) { t.Erase<PortGroupRecord>("g3"); });
     EXPECT_EQ(childrenOf("a"), std::vector<std::string>{});
 }
 
