@@ -108,6 +108,20 @@ expect_stdout "$(cat "$DEFAULT_HOST")"
 sim init --empty --from "$WORK/pass.json"
 expect_status 2
 
+check "init --scale makes a host N times the default's size; a bad scale changes nothing"
+sim init --scale 4
+expect_status 0
+cli network vswitch standard portgroup list
+expect_stdout_matches "Guest Network-3 +switch3 +1 +0"
+sim export
+scaled=$OUT
+for args in "--scale 0" "--scale 1001" "--scale x" "--scale 2 --empty" "--from $WORK/pass.json --scale 2"; do
+  sim init $args
+  expect_status 2
+done
+sim export
+expect_stdout "$scaled"
+
 check "fault add, list and clear"
 sim fault add --operation Trellis_Exec --status 3 --times 2
 expect_status 0

@@ -23,6 +23,8 @@
 #include "trellis/host/HostSession.h"
 #include "trellis/host/records/FirewallRecords.h"
 #include "trellis/host/records/ModuleRecord.h"
+#include "trellis/host/records/PortRecord.h"
+#include "trellis/host/records/SwitchRecords.h"
 
 using namespace Trellis::Host;
 
@@ -138,6 +140,28 @@ TEST(HostStore, MigratesAnOlderStoreInOneStep) {
     const Operation count("HostTest::CountRulesets");
     EXPECT_EQ(count.Read([](Transaction& t) { return t.Count<FirewallRulesetRecord>(); }),
               DefaultRulesetNames().size());
+}
+
+TEST(HostStore, AStoreWithoutParentsGetsTheParentOfEveryPortGroupAndPort) {
+    TempHost host;
+    ImportScaledDefaultHost(3);
+    const std::string before = ExportHost();
+    CloseHost();
+    // The layout of version 3: records without the parent column and its index.
+    RunSql(host.Path(), "DROP INDEX records_by_parent; ALTER TABLE records DROP COLUMN parent; PRAGMA user_version = 3");
+
+    host.Reopen();
+    EXPECT_EQ(ExportHost(), before);
+    const Operation read("HostTest::ReadChildren");
+    read.Read([](Transaction& t) {
+        std::vector<std::string> groups;
+        for (const PortGroupRecord& group : t.ChildrenOf<PortGroupRecord>("switch1")) groups.push_back(group.name);
+        EXPECT_EQ(groups, (std::vector<std::string>{"Host Management-1", "Guest Network-1"}));
+        for (const char* vswitch : {"switch0", "switch1", "switch2"}) {
+            EXPECT_EQ(t.CountChildrenOf<PortGroupRecord>(vswitch), 2u) << vswitch;
+            EXPECT_EQ(t.CountChildrenOf<PortRecord>(vswitch), 2u) << vswitch;
+        }
+    });
 }
 
 TEST(HostStore, ConcurrentWritersLoseNoUpdate) {

@@ -9,6 +9,7 @@
 #include "TempHost.h"
 #include "trellis/host/ExecLog.h"
 #include "trellis/host/records/FirewallRecords.h"
+#include "trellis/host/records/SwitchRecords.h"
 
 using namespace Trellis::Host;
 
@@ -19,6 +20,13 @@ const Operation kRead("HostTest::Read");
 
 std::vector<std::string> CounterNames() {
     return kRead.Read([](Transaction& t) { return t.Names<CounterRecord>(); });
+}
+
+PortGroupRecord GroupOn(const std::string& vswitch, const std::string& name) {
+    PortGroupRecord group;
+    group.name = name;
+    group.vswitch = vswitch;
+    return group;
 }
 
 struct Unrelated {
@@ -57,6 +65,27 @@ TEST(HostTransaction, RecordsKeepTheirPlaceAndKindsStaySeparate) {
     });
 }
 
+TEST(HostTransaction, ChildrenFollowTheirParentThroughPutAndErase) {
+    TempHost host;
+    auto childrenOf = [](const char* parent) {
+        return kRead.Read([&](Transaction& t) {
+            std::vector<std::string> names;
+            for (const PortGroupRecord& child : t.ChildrenOf<PortGroupRecord>(parent)) names.push_back(child.name);
+            EXPECT_EQ(t.CountChildrenOf<PortGroupRecord>(parent), names.size());
+            return names;
+        });
+    };
+    kWrite.Write([](Transaction& t) {
+        for (const PortGroupRecord& record : {GroupOn("a", "g1"), GroupOn("b", "g2"), GroupOn("a", "g3")}) t.Put(record);
+    });
+    EXPECT_EQ(childrenOf("a"), (std::vector<std::string>{"g1", "g3"}));
+    kWrite.Write([](Transaction& t) { t.Put(GroupOn("b", "g1")); });  // in place, with its new parent
+    EXPECT_EQ(childrenOf("a"), (std::vector<std::string>{"g3"}));
+    EXPECT_EQ(childrenOf("b"), (std::vector<std::string>{"g1", "g2"}));
+    kWrite.Write([](Transaction& t) { t.Erase<PortGroupRecord>("g3"); });
+    EXPECT_EQ(childrenOf("a"), std::vector<std::string>{});
+}
+
 TEST(HostTransaction, AFailedOperationChangesNothingAndItsExceptionPassesUnchanged) {
     TempHost host;
     Increment("n");
@@ -89,7 +118,9 @@ TEST(HostTransaction, MisuseIsRefused) {
     // A damaged record is reported as the host's failure, with its place.
     sqlite3* db = nullptr;
     ASSERT_EQ(sqlite3_open(host.Path().c_str(), &db), SQLITE_OK);
-    ASSERT_EQ(sqlite3_exec(db, "INSERT INTO records VALUES ('test.counter', 'bad', '{\"name\":\"bad\",\"value\":\"7\"}')",
+    ASSERT_EQ(sqlite3_exec(db,
+                           "INSERT INTO records (kind, name, data)"
+                           " VALUES ('test.counter', 'bad', '{\"name\":\"bad\",\"value\":\"7\"}')",
                            nullptr, nullptr, nullptr),
               SQLITE_OK);
     sqlite3_close(db);
@@ -104,7 +135,7 @@ TEST(HostTransaction, MisuseIsRefused) {
     ASSERT_EQ(sqlite3_open(host.Path().c_str(), &db), SQLITE_OK);
     ASSERT_EQ(sqlite3_exec(db,
                            "DELETE FROM records WHERE name = 'bad';"
-                           "INSERT INTO records VALUES ('test.counter', 'torn', '{\"name\":\"to');"
+                           "INSERT INTO records (kind, name, data) VALUES ('test.counter', 'torn', '{\"name\":\"to');"
                            "INSERT INTO exec_log (command_line, options, status) VALUES ('true', '[true]', 0)",
                            nullptr, nullptr, nullptr),
               SQLITE_OK);
@@ -131,7 +162,8 @@ TEST(HostTransaction, ReadingOneKindSeeksItsRecordsOnly) {
     sqlite3* db = nullptr;
     ASSERT_EQ(sqlite3_open_v2(host.Path().c_str(), &db, SQLITE_OPEN_READONLY, nullptr), SQLITE_OK);
     for (const char* sql : {"SELECT name, data FROM records WHERE kind = ? ORDER BY rowid",
-                            "SELECT data FROM records WHERE kind = ? AND name = ?"}) {
+                            "SELECT data FROM records WHERE kind = ? AND name = ?",
+                            "SELECT name, data FROM records WHERE kind = ? AND parent = ? ORDER BY rowid"}) {
         SCOPED_TRACE(sql);
         sqlite3_stmt* plan = nullptr;
         ASSERT_EQ(sqlite3_prepare_v2(db, (std::string("EXPLAIN QUERY PLAN ") + sql).c_str(), -1, &plan, nullptr),

@@ -17,6 +17,8 @@
 #include "trellis/host/Description.h"
 #include "trellis/host/HostSession.h"
 #include "trellis/host/JsonReader.h"
+#include "util/OwnedVector"
+#include "trellis/network/PortGroupImpl.h"
 #include "trellis/network/PortsetImpl.h"
 #include "trellis/network/VirtualSwitchImpl.h"
 #include "trellis/network/VirtualSwitchInfoImpl.h"
@@ -77,6 +79,30 @@ TEST(SwitchHost, ARemovedSwitchGoesWithItsGroupsAndFreesItsUplinks) {
     EXPECT_EQ(GroupNamed("Storage"), nullptr);
     SwitchNamed("switch0")->AddUplink("pnet1");  // free again
     EXPECT_EQ(Switch("switch0")["uplinks"], Json({"pnet0", "pnet1"}));
+}
+
+TEST(SwitchHost, GroupsAndPortsCountOnTheirOwnSwitchAsGroupsComeAndGo) {
+    TempHost host;
+    Trellis::Host::ImportScaledDefaultHost(3);
+    auto groupsOf = [](const std::string& vswitch) {
+        Trellis::Util::OwnedVector<Gantry::Network::PortGroup> groups(SwitchNamed(vswitch)->GetPortGroups());
+        Names names;
+        for (Gantry::Network::PortGroup* group : groups) names.push_back(group->GetName());
+        return names;
+    };
+    auto activeClients = [](const std::string& group) {
+        return dynamic_cast<Trellis::Network::PortGroupImpl&>(*GroupNamed(group)).GetActiveClients();
+    };
+    EXPECT_EQ(groupsOf("switch1"), Names({"Host Management-1", "Guest Network-1"}));
+    EXPECT_EQ(SwitchNamed("switch1")->GetUsedPorts(), 3);  // an uplink and two clients
+    EXPECT_EQ(activeClients("Guest Network-1"), 1);
+
+    delete SwitchNamed("switch1")->AddPortGroup("Extra");
+    EXPECT_EQ(groupsOf("switch1"), Names({"Host Management-1", "Guest Network-1", "Extra"}));
+    EXPECT_EQ(groupsOf("switch2"), Names({"Host Management-2", "Guest Network-2"}));
+    EXPECT_EQ(activeClients("Extra"), 0);
+    SwitchNamed("switch1")->RemovePortGroup("Extra");
+    EXPECT_EQ(groupsOf("switch1"), Names({"Host Management-1", "Guest Network-1"}));
 }
 
 TEST(SwitchHost, AnUplinkTakesAPortOfTheSwitch) {

@@ -31,6 +31,22 @@ private:
     Database& db_;
 };
 
+// Holds BEGIN .. COMMIT on a bare connection, the shared lock taken by the
+// first read; ends it if left early.
+class ReadTransaction {
+public:
+    explicit ReadTransaction(Database& db) : db_(db) { db_.Execute("BEGIN"); }
+    ~ReadTransaction() {
+        if (db_.InTransaction()) {
+            try { db_.Execute("ROLLBACK"); } catch (...) {}
+        }
+    }
+    void End() { db_.Execute("COMMIT"); }
+
+private:
+    Database& db_;
+};
+
 }  // namespace
 
 std::vector<Fault> FaultBook::Read(Database& db) {
@@ -54,14 +70,18 @@ void FaultBook::Write(Database& db, const std::vector<Fault>& faults) {
 }
 
 void FaultBook::Reload() {
-    dataVersion_ = db_.QueryInt("PRAGMA data_version");
+    // One read transaction, so that the counter is the one of the faults read.
+    ReadTransaction transaction(db_);
+    std::vector<Fault> faults = Read(db_);
+    changeCounter_ = db_.FileChangeCounter();
+    transaction.End();
     armed_.clear();
-    for (Fault& fault : Read(db_)) armed_[fault.operation] = std::move(fault);
+    for (Fault& fault : faults) armed_[fault.operation] = std::move(fault);
     loaded_ = true;
 }
 
 void FaultBook::RefreshIfChanged() {
-    if (!loaded_ || db_.QueryInt("PRAGMA data_version") != dataVersion_) Reload();
+    if (!loaded_ || db_.FileChangeCounter() != changeCounter_) Reload();
 }
 
 std::optional<Fault> FaultBook::Hit(const std::string& operation) {

@@ -14,8 +14,9 @@ namespace Host {
 class Database;
 
 // The faults table of one store, with a cache of the armed faults so that an
-// operation without a fault costs one PRAGMA data_version: the cache is read
-// again only when another connection has committed since.
+// operation without a fault costs one read of the database file's change
+// counter, without a lock: the cache is read again only when a connection
+// has committed since.
 class FaultBook {
 public:
     explicit FaultBook(Database& db) : db_(db) {}
@@ -42,7 +43,7 @@ private:
 
     Database& db_;
     bool loaded_ = false;
-    std::int64_t dataVersion_ = 0;
+    std::uint32_t changeCounter_ = 0;  // of the file, when the cache was read
     std::map<std::string, Fault> armed_;
 };
 

@@ -60,6 +60,7 @@ void BuildDefaultHost(const std::string& temporary) {
     {
         TransactionScope scope(store, true);
         CreateBaseSchema(store.Db());
+        UpgradeTableLayout(store.Db());
         WriteDescription(scope.Get(), DefaultDescription());
         store.Db().Execute("PRAGMA user_version = " + std::to_string(LatestSchemaVersion()));
         scope.Commit();

@@ -5,9 +5,21 @@
 #include "host/Sqlite.h"
 #include "host/description/DescriptionIo.h"
 #include "trellis/host/Transaction.h"
+#include "trellis/host/records/PortRecord.h"
+#include "trellis/host/records/SwitchRecords.h"
 
 namespace Trellis {
 namespace Host {
+
+namespace {
+
+// Writes every record of the kind again, which stores its parent.
+template <class R>
+void StoreParents(Transaction& t) {
+    for (const R& record : t.List<R>()) t.Put(record);
+}
+
+}  // namespace
 
 const std::vector<Migration>& Migrations() {
     static const std::vector<Migration> steps = {
@@ -22,6 +34,11 @@ const std::vector<Migration>& Migrations() {
              SeedSection(t, "standardSwitches");
              SeedSection(t, "portGroups");
              SeedSection(t, "ports");
+         }},
+        {4, "the parent of every port group and port, found through an index",
+         [](Transaction& t) {
+             StoreParents<PortGroupRecord>(t);
+             StoreParents<PortRecord>(t);
          }},
     };
     return steps;
@@ -56,6 +73,12 @@ void CreateBaseSchema(Database& db) {
                "  options TEXT NOT NULL,"  // the three flags, as a JSON array
                "  status INTEGER NOT NULL);"
                "PRAGMA user_version = 1;");
+}
+
+void UpgradeTableLayout(Database& db) {
+    if (db.QueryInt("SELECT count(*) FROM pragma_table_info('records') WHERE name = 'parent'") == 0)
+        db.Execute("ALTER TABLE records ADD COLUMN parent TEXT");  // the name of the object it belongs to
+    db.Execute("CREATE INDEX IF NOT EXISTS records_by_parent ON records (kind, parent)");
 }
 
 void SeedSection(Transaction& t, const char* key) {

@@ -3,15 +3,19 @@
 // The store's layout and its versions.
 //
 // PRAGMA application_id marks a file as a host store; PRAGMA user_version is
-// its schema version. A new host is created at kLatestVersion from the
-// default description; an older one is brought up to date on open by the
-// migration steps after its version, all in one transaction.
+// its schema version. A new host is created at the latest version: the
+// tables of version 1 in the current layout, then the default description.
+// An older one is brought up to date on open, in one transaction: first its
+// tables are given the current layout, then the migration steps after its
+// version fill in the data. The layout comes first because every step writes
+// records as this build does, with the columns this build knows.
 //
 // To add a step (say, switches join the host): append
 //   {3, "switches", [](Transaction& t) { SeedSection(t, "switches"); }}
-// to the list in Schema.cpp. kLatestVersion follows the list. A step must
+// to the list in Schema.cpp. The latest version follows the list. A step must
 // work on any store of the version before it and must not assume that the
-// user left the default inventory alone.
+// user left the default inventory alone. A new column or index goes into
+// UpgradeTableLayout, which must leave a table already in that layout alone.
 
 #include <cstdint>
 #include <vector>
@@ -36,6 +40,9 @@ int LatestSchemaVersion();
 
 // Creates the tables of version 1, the bare store, with no records.
 void CreateBaseSchema(Database& db);
+// Brings the tables of any version to the current layout: records gains its
+// parent column and the index on (kind, parent).
+void UpgradeTableLayout(Database& db);
 // The names of the tables of version 1, which every store has.
 const std::vector<const char*>& BaseTables();
 

@@ -77,6 +77,20 @@ bool Database::InTransaction() const {
     return sqlite3_get_autocommit(db_) == 0;
 }
 
+std::uint32_t Database::FileChangeCounter() {
+    constexpr int kCounterOffset = 24;  // in the database header
+    sqlite3_file* file = nullptr;
+    int rc = sqlite3_file_control(db_, "main", SQLITE_FCNTL_FILE_POINTER, &file);
+    if (rc != SQLITE_OK || file == nullptr || file->pMethods == nullptr)
+        throw SqliteError(rc == SQLITE_OK ? SQLITE_ERROR : rc, "The database file cannot be read");
+    unsigned char bytes[4];
+    rc = file->pMethods->xRead(file, bytes, sizeof bytes, kCounterOffset);
+    // A file too short to hold a header reads as zeros: a store not written yet.
+    if (rc != SQLITE_OK && rc != SQLITE_IOERR_SHORT_READ)
+        throw SqliteError(rc, "The header of the database file cannot be read");
+    return std::uint32_t{bytes[0]} << 24 | std::uint32_t{bytes[1]} << 16 | std::uint32_t{bytes[2]} << 8 | bytes[3];
+}
+
 Statement::Statement(Database& db, const std::string& sql) : db_(&db), sql_(sql), stmt_(db.Acquire(sql)) {}
 
 Statement::~Statement() {

@@ -47,6 +47,12 @@ public:
     // Rows changed by the last INSERT, UPDATE or DELETE.
     int Changes() const;
     bool InTransaction() const;
+    // The change counter in the header of the database file, as the file
+    // holds it now, read without a lock. In rollback journal mode every
+    // commit of any connection changes it before the commit completes, so
+    // a reader that saw a value under a lock and sees it again knows that
+    // nothing was committed in between.
+    std::uint32_t FileChangeCounter();
 
     [[noreturn]] void Fail(int code, const std::string& what) const;
 

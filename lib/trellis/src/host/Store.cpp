@@ -86,6 +86,7 @@ void Store::Migrate() {
     TransactionScope scope(*this, true);
     // Read again under the write lock: another process may have migrated meanwhile.
     std::int64_t version = db_->QueryInt("PRAGMA user_version");
+    UpgradeTableLayout(*db_);
     for (const Migration& step : Migrations()) {
         if (step.version <= version) continue;
         step.apply(scope.Get());

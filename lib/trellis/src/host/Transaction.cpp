@@ -69,6 +69,30 @@ std::vector<std::pair<std::string, Json>> Transaction::ListData(const std::strin
     });
 }
 
+std::vector<std::pair<std::string, Json>> Transaction::ChildrenData(const std::string& kind,
+                                                                    const std::string& parent) const {
+    return GuardedSql(store_, [&] {
+        std::vector<std::pair<std::string, Json>> records;
+        Statement query =
+            store_.Db().Prepare("SELECT name, data FROM records WHERE kind = ? AND parent = ? ORDER BY rowid");
+        query.Bind(1, kind).Bind(2, parent);
+        while (query.Step()) {
+            std::string name = query.Text(0);
+            records.emplace_back(name, ParseStored(kind, name, query.Text(1)));
+        }
+        return records;
+    });
+}
+
+std::size_t Transaction::CountChildren(const std::string& kind, const std::string& parent) const {
+    return GuardedSql(store_, [&] {
+        Statement query = store_.Db().Prepare("SELECT count(*) FROM records WHERE kind = ? AND parent = ?");
+        query.Bind(1, kind).Bind(2, parent);
+        query.Step();
+        return static_cast<std::size_t>(query.Int(0));
+    });
+}
+
 std::vector<std::string> Transaction::NamesOf(const std::string& kind) const {
     return GuardedSql(store_, [&] {
         std::vector<std::string> names;
@@ -96,17 +120,19 @@ std::size_t Transaction::CountOf(const std::string& kind) const {
     });
 }
 
-void Transaction::PutData(const std::string& kind, const std::string& name, const Json& data) {
+void Transaction::PutData(const std::string& kind, const std::string& name, const Json& data,
+                          const std::optional<std::string>& parent) {
     RequireWrite();
     const std::string text = StorableText(kind, name, data);
     GuardedSql(store_, [&] {
         // An upsert keeps the rowid, and so the record's place in its list.
         store_.Db()
-            .Prepare("INSERT INTO records (kind, name, data) VALUES (?, ?, ?)"
-                     " ON CONFLICT (kind, name) DO UPDATE SET data = excluded.data")
+            .Prepare("INSERT INTO records (kind, name, data, parent) VALUES (?, ?, ?, ?)"
+                     " ON CONFLICT (kind, name) DO UPDATE SET data = excluded.data, parent = excluded.parent")
             .Bind(1, kind)
             .Bind(2, name)
             .Bind(3, text)
+            .Bind(4, parent)
             .Run();
     });
 }

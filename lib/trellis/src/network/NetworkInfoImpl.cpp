@@ -1,6 +1,5 @@
 #include "trellis/network/NetworkInfoImpl.h"
 
-#include <optional>
 #include <utility>
 
 #include "trellis/host/Operation.h"
@@ -31,15 +30,15 @@ NetworkInfoImpl::NetworkInfoImpl() { kConstruct.Check(); }
 NetworkInfoImpl::~NetworkInfoImpl() {}
 
 std::vector<Gantry::Network::Pnic*> NetworkInfoImpl::GetPnics() {
-    std::vector<PnicRecord> records = kGetPnics.Read([](Transaction& t) { return t.List<PnicRecord>(); });
+    std::vector<std::string> names = kGetPnics.Read([](Transaction& t) { return t.Names<PnicRecord>(); });
     std::vector<Gantry::Network::Pnic*> nics;
-    for (PnicRecord& record : records) nics.push_back(new PnicImpl(std::move(record)));
+    for (std::string& name : names) nics.push_back(new PnicImpl(std::move(name)));
     return nics;
 }
 
 Gantry::Network::Pnic* NetworkInfoImpl::GetPnicByName(std::string const& name) {
-    std::optional<PnicRecord> record = kGetPnicByName.Read([&](Transaction& t) { return t.Find<PnicRecord>(name); });
-    return record ? new PnicImpl(std::move(*record)) : nullptr;
+    bool found = kGetPnicByName.Read([&](Transaction& t) { return t.Contains<PnicRecord>(name); });
+    return found ? new PnicImpl(name) : nullptr;
 }
 
 std::vector<Gantry::Network::PortGroup*> NetworkInfoImpl::GetAllPortGroups() {

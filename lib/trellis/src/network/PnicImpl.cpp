@@ -3,6 +3,7 @@
 #include <utility>
 
 #include "trellis/host/Operation.h"
+#include "trellis/host/records/PnicRecord.h"
 
 namespace Trellis {
 namespace Network {
@@ -12,13 +13,13 @@ const Trellis::Host::Operation kGetName("Pnic::GetName");
 const Trellis::Host::Operation kIsValidPnic("PnicImpl::IsValidPnic");
 }  // namespace
 
-PnicImpl::PnicImpl(Trellis::Host::PnicRecord snapshot) : snapshot_(std::move(snapshot)) {}
+PnicImpl::PnicImpl(std::string name) : name_(std::move(name)) {}
 
 PnicImpl::~PnicImpl() {}
 
 std::string PnicImpl::GetName() {
     kGetName.Check();
-    return snapshot_.name;
+    return name_;
 }
 
 bool PnicImpl::IsValidPnic(std::string const& name) {

@@ -35,31 +35,17 @@ PortGroupRecord RequirePortGroup(Transaction const& t, std::string const& name) 
 }
 
 std::vector<PortGroupRecord> PortGroupsOf(Transaction const& t, std::string const& vswitch) {
-    std::vector<PortGroupRecord> groups = t.List<PortGroupRecord>();
-    groups.erase(std::remove_if(groups.begin(), groups.end(),
-                                [&](PortGroupRecord const& group) { return group.vswitch != vswitch; }),
-                 groups.end());
-    return groups;
+    return t.ChildrenOf<PortGroupRecord>(vswitch);
 }
-
-namespace {
-
-template <class Match>
-std::int64_t CountPorts(Transaction const& t, Match match) {
-    std::vector<PortRecord> ports = t.List<PortRecord>();
-    return std::count_if(ports.begin(), ports.end(), match);
-}
-
-}  // namespace
 
 std::int64_t ClientPortsOf(Transaction const& t, std::string const& vswitch) {
-    return CountPorts(t, [&](PortRecord const& port) { return port.portset == vswitch; });
+    return static_cast<std::int64_t>(t.CountChildrenOf<PortRecord>(vswitch));
 }
 
 std::int64_t ActiveClientsOf(Transaction const& t, PortGroupRecord const& group) {
-    return CountPorts(t, [&](PortRecord const& port) {
-        return port.portset == group.vswitch && port.portGroup == group.name;
-    });
+    std::vector<PortRecord> ports = t.ChildrenOf<PortRecord>(group.vswitch);
+    return std::count_if(ports.begin(), ports.end(),
+                         [&](PortRecord const& port) { return port.portGroup == group.name; });
 }
 
 int UsedPortsOf(Transaction const& t, StandardSwitchRecord const& vswitch) {

@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <iostream>
+#include <optional>
 
 #include "gantry/lib/GantryException.h"
 #include "host/StoredText.h"
@@ -23,7 +24,9 @@ const char* const kMainHelp =
     "Controls the simulated host that haldencli works on.\n"
     "\n"
     "Commands:\n"
-    "  init [--empty | --from FILE]   (Re)create the host: default inventory, empty, or from a description\n"
+    "  init [--empty | --from FILE | --scale N]\n"
+    "                                 (Re)create the host: default inventory, empty, from a\n"
+    "                                 description, or N times the default's size\n"
     "  export                         Print the host as a JSON description\n"
     "  import FILE                    Replace the host with a description (- reads standard input)\n"
     "  fault add ...                  Arm a fault for a host operation\n"
@@ -37,11 +40,18 @@ const char* const kMainHelp =
     "  --help        Show help; '<command> --help' shows a command's.\n";
 
 const char* const kInitHelp =
-    "Usage: haldensim [--host PATH] init [--empty | --from FILE]\n"
+    "Usage: haldensim [--host PATH] init [--empty | --from FILE | --scale N]\n"
     "\n"
     "Replaces the whole host (records, faults, exec log) with the default inventory,\n"
     "with an empty host (--empty), or with the description in FILE (--from; '-' for\n"
-    "standard input). FILE is a regular file of at most 256 MiB.\n";
+    "standard input). FILE is a regular file of at most 256 MiB.\n"
+    "\n"
+    "--scale N (1 to 1000) makes the host N times the default's size: the default\n"
+    "host and N-1 renamed copies of its NICs, standard switches, port groups, ports\n"
+    "and firewall rulesets (switch0 -> switch1, pnet0 -> pnet3, dhcp -> dhcp-1, ...).\n"
+    "Each copy's references stay within the copy; the host's singletons (the\n"
+    "modules, the firewall's state) stay single; copied switches get fewer\n"
+    "configured ports where the host's limit of 4608 requires.\n";
 
 const char* const kExportHelp =
     "Usage: haldensim [--host PATH] export\n"
@@ -90,14 +100,39 @@ void RequireNoPositionals(const ParsedOptions& options) {
     if (!options.positionals.empty()) throw UsageError("unexpected argument " + Host::Quoted(options.positionals[0]));
 }
 
+// The one of --empty, --from and --scale that init was given, if any.
+std::optional<std::string> InitSource(const ParsedOptions& options) {
+    std::optional<std::string> source;
+    for (const char* name : {"empty", "from", "scale"}) {
+        if (!options.Has(name)) continue;
+        if (source) throw UsageError("--" + *source + " and --" + name + " exclude each other");
+        source = name;
+    }
+    return source;
+}
+
+int ParseScale(const std::string& text) {
+    int scale = ParseInt("--scale", text);
+    if (scale < 1 || scale > Host::kMaxHostScale)
+        throw UsageError("--scale expects an integer from 1 to " + std::to_string(Host::kMaxHostScale) + ", not " +
+                         Host::Quoted(text));
+    return scale;
+}
+
 int Init(const std::vector<std::string>& args, std::size_t next, const std::string& hostOption, Io& io) {
-    ParsedOptions options = ParseOptions(args, next, {{"empty", false}, {"from", true}});
+    ParsedOptions options = ParseOptions(args, next, {{"empty", false}, {"from", true}, {"scale", true}});
     if (options.Has("help")) return io.out << kInitHelp, kExitOk;
     RequireNoPositionals(options);
-    if (options.Has("empty") && options.Has("from")) throw UsageError("--empty and --from exclude each other");
+    std::optional<std::string> source = InitSource(options);
+    if (source == "scale") {
+        int scale = ParseScale(*options.Get("scale"));
+        OpenHostOf(hostOption);
+        Host::ImportScaledDefaultHost(scale);
+        return kExitOk;
+    }
     std::string description = Host::kDefaultHostDescription;
-    if (options.Has("empty")) description = "{\"format\": 1}";
-    if (options.Has("from")) description = ReadDescriptionInput(*options.Get("from"), io.in);
+    if (source == "empty") description = "{\"format\": 1}";
+    if (source == "from") description = ReadDescriptionInput(*options.Get("from"), io.in);
     OpenHostOf(hostOption);
     Host::ImportHost(description);
     return kExitOk;

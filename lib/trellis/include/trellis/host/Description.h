@@ -23,5 +23,15 @@ std::string ExportHost();
 // was.
 void ImportHost(const std::string& descriptionText);
 
+// The largest scale ImportScaledDefaultHost takes.
+constexpr int kMaxHostScale = 1000;
+
+// Replaces the whole open host, as ImportHost does, with the default host
+// scale times its size (1 to kMaxHostScale): the default host and scale - 1
+// renamed copies of its switching, NICs and firewall rulesets, each copy's
+// references resolving within it (docs/host-format.md). The description is
+// checked as an imported one is.
+void ImportScaledDefaultHost(int scale);
+
 }  // namespace Host
 }  // namespace Trellis

@@ -13,6 +13,14 @@
 //       static FirewallRulesetRecord FromJson(const JsonReader& in);  // checks every field
 //   };
 //
+// A record that belongs to another object declares that object's name as its
+// parent, by a member found at compile time:
+//
+//   std::string Parent() const { return vswitch; }     // a port group's switch
+//
+// Put stores it, so that ChildrenOf and CountChildrenOf find the children of
+// one parent through an index, without reading the other records of the kind.
+//
 // Records of one kind are listed in the order they were first stored; Put of
 // an existing name replaces the record in place. Reading one kind touches no
 // other kind. Failures of the store itself surface as GantryException.
@@ -21,6 +29,7 @@
 #include <memory>
 #include <optional>
 #include <string>
+#include <type_traits>
 #include <utility>
 #include <vector>
 
@@ -33,6 +42,12 @@ namespace Trellis {
 namespace Host {
 
 class Store;
+
+// Whether records of type R declare a parent.
+template <class R, class = void>
+struct HasParent : std::false_type {};
+template <class R>
+struct HasParent<R, std::void_t<decltype(std::declval<const R&>().Parent())>> : std::true_type {};
 
 class Transaction {
 public:
@@ -77,10 +92,28 @@ public:
         return CountOf(R::kKind);
     }
 
+    // The records whose parent is parent, in the order of List.
+    template <class R>
+    std::vector<R> ChildrenOf(const std::string& parent) const {
+        static_assert(HasParent<R>::value, "the record type declares no Parent()");
+        std::vector<R> records;
+        for (const auto& entry : ChildrenData(R::kKind, parent)) records.push_back(Decode<R>(entry.second, entry.first));
+        return records;
+    }
+
+    template <class R>
+    std::size_t CountChildrenOf(const std::string& parent) const {
+        static_assert(HasParent<R>::value, "the record type declares no Parent()");
+        return CountChildren(R::kKind, parent);
+    }
+
     // Inserts the record, or replaces the one of the same name in its place.
     template <class R>
     void Put(const R& record) {
-        PutData(R::kKind, record.name, record.ToJson());
+        if constexpr (HasParent<R>::value)
+            PutData(R::kKind, record.name, record.ToJson(), record.Parent());
+        else
+            PutData(R::kKind, record.name, record.ToJson());
     }
 
     // Whether there was such a record.
@@ -101,7 +134,10 @@ public:
     std::vector<std::string> NamesOf(const std::string& kind) const;
     bool ContainsData(const std::string& kind, const std::string& name) const;
     std::size_t CountOf(const std::string& kind) const;
-    void PutData(const std::string& kind, const std::string& name, const Json& data);
+    std::vector<std::pair<std::string, Json>> ChildrenData(const std::string& kind, const std::string& parent) const;
+    std::size_t CountChildren(const std::string& kind, const std::string& parent) const;
+    void PutData(const std::string& kind, const std::string& name, const Json& data,
+                 const std::optional<std::string>& parent = std::nullopt);
     bool EraseData(const std::string& kind, const std::string& name);
     void EraseKind(const std::string& kind);
 

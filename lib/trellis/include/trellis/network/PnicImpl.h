@@ -3,16 +3,17 @@
 #include <string>
 
 #include "gantry/network/Pnic.h"
-#include "trellis/host/records/PnicRecord.h"
 
 namespace Trellis {
 namespace Network {
 
-// A physical NIC of the simulated host. Holds the snapshot of its record
-// taken by the lookup that made it.
+// A physical NIC of the simulated host, made by a lookup that found it. It
+// holds its name only, so that listing the NICs reads no record: a NIC
+// answers nothing else yet, and what it comes to answer from its record is
+// read when asked.
 class PnicImpl : public virtual Gantry::Network::Pnic {
 public:
-    explicit PnicImpl(Trellis::Host::PnicRecord snapshot);
+    explicit PnicImpl(std::string name);
     ~PnicImpl() override;
 
     std::string GetName() override;
@@ -21,7 +22,7 @@ public:
     static bool IsValidPnic(std::string const& name);
 
 private:
-    Trellis::Host::PnicRecord snapshot_;
+    std::string name_;
 };
 
 }  // namespace Network

@@ -1,9 +1,13 @@
 #include "trellis/host/Description.h"
 
+#include <stdexcept>
+#include <string>
+
 #include <nlohmann/json.hpp>
 
 #include "host/Store.h"
 #include "host/description/DescriptionIo.h"
+#include "host/description/ScaledDescription.h"
 #include "trellis/host/Transaction.h"
 
 namespace Trellis {
@@ -17,9 +21,10 @@ std::string ExportHost() {
     return DescriptionText(description);
 }
 
-void ImportHost(const std::string& descriptionText) {
-    // Everything is checked before the write lock is taken.
-    ParsedDescription description = ParseDescription(ParseDescriptionText(descriptionText));
+namespace {
+
+// The description was checked before the write lock is taken.
+void ImportParsed(const ParsedDescription& description) {
     Store& store = CurrentStore();
     {
         TransactionScope scope(store, true);
@@ -27,6 +32,19 @@ void ImportHost(const std::string& descriptionText) {
         scope.Commit();
     }
     GuardedSql(store, [&] { store.Faults().Reload(); });
+}
+
+}  // namespace
+
+void ImportHost(const std::string& descriptionText) {
+    ImportParsed(ParseDescription(ParseDescriptionText(descriptionText)));
+}
+
+void ImportScaledDefaultHost(int scale) {
+    if (scale < 1 || scale > kMaxHostScale)
+        throw std::invalid_argument("A host scale from 1 to " + std::to_string(kMaxHostScale) + " was expected, not " +
+                                    std::to_string(scale));
+    ImportParsed(ParseDescription(ScaledDescription(DefaultDescription(), scale)));
 }
 
 }  // namespace Host

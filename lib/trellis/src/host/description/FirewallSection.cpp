@@ -4,6 +4,7 @@
 
 #include <nlohmann/json.hpp>
 
+#include "host/description/HostCopy.h"
 #include "host/description/Section.h"
 #include "trellis/host/Transaction.h"
 #include "trellis/host/records/FirewallRecords.h"
@@ -56,6 +57,15 @@ public:
         for (const FirewallDynamicRuleRecord& rule : t.List<FirewallDynamicRuleRecord>())
             firewall["dynamicRules"].push_back(rule.ToJson());
         return firewall;
+    }
+
+    // The state stays single; the dynamic rules are run-time state of the
+    // one firewall and are not copied either.
+    void AddCopy(HostCopy& copy, Json& value) const override {
+        for (FirewallRulesetRecord ruleset : rulesets_) {
+            ruleset.name = copy.Name(FirewallRulesetRecord::kKind, ruleset.name);
+            value["rulesets"].push_back(ruleset.ToJson());
+        }
     }
 
 private:

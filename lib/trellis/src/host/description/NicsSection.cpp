@@ -4,6 +4,7 @@
 
 #include <nlohmann/json.hpp>
 
+#include "host/description/HostCopy.h"
 #include "host/description/Section.h"
 #include "trellis/host/Transaction.h"
 #include "trellis/host/records/PnicRecord.h"
@@ -32,6 +33,13 @@ public:
         Json nics = Json::array();
         for (const PnicRecord& nic : t.List<PnicRecord>()) nics.push_back(nic.ToJson());
         return nics;
+    }
+
+    void AddCopy(HostCopy& copy, Json& value) const override {
+        for (PnicRecord nic : nics_) {
+            nic.name = copy.Name(PnicRecord::kKind, nic.name);
+            value.push_back(nic.ToJson());
+        }
     }
 
 private:

@@ -39,6 +39,15 @@ Json PortGroupsSection::Export(const Transaction& t) const {
     return groups;
 }
 
+void PortGroupsSection::AddCopy(HostCopy& copy, Json& value) const {
+    for (PortGroupRecord group : groups_) {
+        group.name = copy.Name(PortGroupRecord::kKind, group.name);
+        group.vswitch = copy.Name(StandardSwitchRecord::kKind, group.vswitch);
+        CopyUplinkOrder(copy, group.policies);
+        value.push_back(group.ToJson());
+    }
+}
+
 const PortGroupRecord* PortGroupsSection::Find(const std::string& name) const {
     for (const PortGroupRecord& group : groups_)
         if (group.name == name) return &group;

@@ -2,8 +2,10 @@
 // Each port's switch and port group exist and belong together, and no switch
 // has more ports in use (clients and uplinks) than it has ports.
 
+#include <algorithm>
 #include <map>
 #include <set>
+#include <string>
 
 #include <nlohmann/json.hpp>
 
@@ -51,6 +53,40 @@ Json PortsSection::Export(const Transaction& t) const {
     Json ports = Json::array();
     for (const PortRecord& port : t.List<PortRecord>()) ports.push_back(port.ToJson());
     return ports;
+}
+
+namespace {
+
+// The families of the names of the ports' clients, shared with the sections
+// of kernel interfaces and VMs when they join, so that their copies match.
+constexpr const char* kInterfaceNames = "tesselNic";
+constexpr const char* kVmNames = "vm";
+
+// A VM adapter is named by its VM, a point and the adapter: the VM is copied,
+// the adapter keeps its name ("web01.eth0" -> "web02.eth0").
+std::string CopiedClientName(HostCopy& copy, const PortRecord& port) {
+    if (port.clientKind == PortClientKind::TesselNic) return copy.Name(kInterfaceNames, port.clientName);
+    std::size_t point = port.clientName.rfind('.');
+    if (point == std::string::npos) return copy.Name(kVmNames, port.clientName);
+    return copy.Name(kVmNames, port.clientName.substr(0, point)) + port.clientName.substr(point);
+}
+
+}  // namespace
+
+void PortsSection::AddCopy(HostCopy& copy, Json& value) const {
+    for (PortRecord port : ports_) {
+        port.name = copy.Name(PortRecord::kKind, port.name);
+        port.id = std::stoll(port.name);
+        port.portset = copy.Name(StandardSwitchRecord::kKind, port.portset);
+        port.portGroup = copy.Name(PortGroupRecord::kKind, port.portGroup);
+        port.clientName = CopiedClientName(copy, port);
+        value.push_back(port.ToJson());
+    }
+}
+
+int PortsSection::PortsOn(const std::string& vswitch) const {
+    return static_cast<int>(
+        std::count_if(ports_.begin(), ports_.end(), [&](const PortRecord& port) { return port.portset == vswitch; }));
 }
 
 namespace {

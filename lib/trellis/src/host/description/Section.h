@@ -12,7 +12,8 @@
 // every section, then CheckReferences of every section, and only then, in one
 // transaction on a host whose records, faults and exec log were all erased,
 // Write of every section. Export writes, after "format", each section's
-// Export under its key.
+// Export under its key. A host N times the size of another is made by each
+// section's AddCopy, once for every copy (see HostCopy.h).
 
 #include <functional>
 #include <memory>
@@ -25,6 +26,7 @@
 namespace Trellis {
 namespace Host {
 
+class HostCopy;
 class ParsedDescription;
 class Transaction;
 
@@ -40,6 +42,14 @@ public:
     virtual void Write(Transaction& t) const = 0;
     // The section's part of the host, in the form that Parse reads.
     virtual Json Export(const Transaction& t) const = 0;
+    // Adds to value, the section's value in the description being made, the
+    // copy of what Parse kept, its names given by copy.Name. A section that
+    // holds one of a kind for the whole host (the firewall's state, the
+    // modules) keeps it single and adds nothing.
+    virtual void AddCopy(HostCopy& copy, Json& value) const {
+        (void)copy;
+        (void)value;
+    }
 };
 
 struct SectionType {

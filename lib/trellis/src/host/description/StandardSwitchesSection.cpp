@@ -4,6 +4,7 @@
 // of the "nics" section: a NIC that went away stays listed by its switch
 // (the tools hide it).
 
+#include <algorithm>
 #include <map>
 #include <set>
 
@@ -11,6 +12,7 @@
 
 #include "host/description/SwitchingSections.h"
 #include "trellis/host/Transaction.h"
+#include "trellis/host/records/PnicRecord.h"
 
 namespace Trellis {
 namespace Host {
@@ -44,6 +46,41 @@ Json StandardSwitchesSection::Export(const Transaction& t) const {
     Json switches = Json::array();
     for (const StandardSwitchRecord& vswitch : t.List<StandardSwitchRecord>()) switches.push_back(vswitch.ToJson());
     return switches;
+}
+
+// The host's configured ports are shared among the copies. Where a copy's
+// switches would take more than its share, each keeps the ports it uses and
+// gets a part of what is left of the share, in proportion to the ports it
+// has beyond those.
+void StandardSwitchesSection::AddCopy(HostCopy& copy, Json& value) const {
+    const PortsSection& ports = copy.Original().Get<PortsSection>();
+    auto usedPorts = [&](const StandardSwitchRecord& vswitch) {
+        return static_cast<int>(vswitch.uplinks.size()) + ports.PortsOn(vswitch.name);
+    };
+    int configured = 0;
+    int used = 0;
+    for (const StandardSwitchRecord& vswitch : switches_) {
+        configured += vswitch.numPorts;
+        used += usedPorts(vswitch);
+    }
+    const int share =
+        copy.Copies() == 0 ? configured : (SwitchLimits::kMaxPortsPerHost - configured) / copy.Copies();
+    for (StandardSwitchRecord vswitch : switches_) {
+        if (configured > share) {
+            const int inUse = usedPorts(vswitch);
+            const int spare = std::max(share - used, 0);
+            const int extra = configured == used ? 0 : (vswitch.numPorts - inUse) * spare / (configured - used);
+            vswitch.numPorts = std::max(SwitchLimits::kMinPorts, inUse + extra);
+        }
+        vswitch.name = copy.Name(StandardSwitchRecord::kKind, vswitch.name);
+        for (std::string& uplink : vswitch.uplinks) uplink = copy.Name(PnicRecord::kKind, uplink);
+        CopyUplinkOrder(copy, vswitch.policies);
+        value.push_back(vswitch.ToJson());
+    }
+}
+
+void CopyUplinkOrder(HostCopy& copy, StoredPolicies& policies) {
+    for (std::string& uplink : policies.teaming.uplinkOrder) uplink = copy.Name(PnicRecord::kKind, uplink);
 }
 
 const StandardSwitchRecord* StandardSwitchesSection::Find(const std::string& name) const {

@@ -3,10 +3,12 @@
 // The sections of the host's standard switching, declared here because each
 // checks its references into the one before it:
 //   "standardSwitches" -> "portGroups" (a group's switch) -> "ports" (a
-//   port's switch and group).
+//   port's switch and group);
+// and the copy of a switch keeps the ports that "ports" has in use on it.
 
 #include <vector>
 
+#include "host/description/HostCopy.h"
 #include "host/description/Section.h"
 #include "trellis/host/records/PortRecord.h"
 #include "trellis/host/records/SwitchRecords.h"
@@ -14,11 +16,15 @@
 namespace Trellis {
 namespace Host {
 
+// The copy of a stored teaming policy's uplink order names the copied NICs.
+void CopyUplinkOrder(HostCopy& copy, StoredPolicies& policies);
+
 class StandardSwitchesSection : public Section {
 public:
     void Parse(const JsonReader& value) override;
     void Write(Transaction& t) const override;
     Json Export(const Transaction& t) const override;
+    void AddCopy(HostCopy& copy, Json& value) const override;
 
     const StandardSwitchRecord* Find(const std::string& name) const;
 
@@ -32,6 +38,7 @@ public:
     void CheckReferences(const ParsedDescription& description) const override;
     void Write(Transaction& t) const override;
     Json Export(const Transaction& t) const override;
+    void AddCopy(HostCopy& copy, Json& value) const override;
 
     const PortGroupRecord* Find(const std::string& name) const;
 
@@ -46,6 +53,10 @@ public:
     void CheckReferences(const ParsedDescription& description) const override;
     void Write(Transaction& t) const override;
     Json Export(const Transaction& t) const override;
+    void AddCopy(HostCopy& copy, Json& value) const override;
+
+    // The client ports on a switch.
+    int PortsOn(const std::string& vswitch) const;
 
 private:
     std::vector<PortRecord> ports_;

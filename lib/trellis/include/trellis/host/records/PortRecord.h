@@ -28,6 +28,7 @@ struct PortRecord {
     // VM's name, a point and the adapter ("web01.eth0").
     std::string clientName;
 
+    std::string Parent() const { return portset; }
     Json ToJson() const;  // without the name
     static PortRecord FromJson(const JsonReader& in);
 };

@@ -54,6 +54,7 @@ struct PortGroupRecord {
     int vlanId = 0;
     StoredPolicies policies;
 
+    std::string Parent() const { return vswitch; }
     Json ToJson() const;
     static PortGroupRecord FromJson(const JsonReader& in);
 };
