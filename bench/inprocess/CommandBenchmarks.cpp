@@ -39,6 +39,7 @@ void RunCommandLine(benchmark::State& state, std::string const& host, int status
     AutoCli_RegisterNamespaces(root);
     Trellis::Host::OpenHost(HostPath(host));
     Plinth::Cli::Tool tool(root, "haldencli", [](std::string const&) {});
+    tool.SetHostHold(Trellis::Host::HoldHost, Trellis::Host::ReleaseHost);
     std::ostringstream out, err;
     for (auto _ : state) {
         out.str("");

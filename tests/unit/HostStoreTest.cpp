@@ -235,3 +235,23 @@ TEST(HostStore, TheNextOpenRemovesWhatAKilledCreatorLeftAndSparesAllElse) {
     for (const std::string& file : abandoned) EXPECT_FALSE(std::filesystem::exists(file)) << file;
     for (const std::string& file : kept) EXPECT_TRUE(std::filesystem::exists(file)) << file;
 }
+
+TEST(HostStore, AHeldHostKeepsOtherProcessesOutUntilItsRelease) {
+    TempHost host;
+    // Another process's read, without waiting: SQLITE_BUSY while the host is held.
+    auto readElsewhere = [&host] {
+        return RunInChildren(1, [&host](int) {
+            sqlite3* db = nullptr;
+            if (sqlite3_open_v2(host.Path().c_str(), &db, SQLITE_OPEN_READONLY, nullptr) != SQLITE_OK) return 2;
+            int rc = sqlite3_exec(db, "SELECT count(*) FROM records", nullptr, nullptr, nullptr);
+            sqlite3_close(db);
+            return rc;
+        })[0];
+    };
+    HoldHost();
+    Increment("held");  // operations run as before while the host is held
+    EXPECT_EQ(readElsewhere(), SQLITE_BUSY);
+    ReleaseHost();
+    EXPECT_EQ(readElsewhere(), SQLITE_OK);
+    EXPECT_EQ(CounterValue("held"), 1);
+}

@@ -26,6 +26,7 @@ int main(int argc, char** argv) {
         return Plinth::Cli::EXIT_REFUSED;
     }
     Plinth::Cli::Tool tool(root, "haldencli", OpenHost);
+    tool.SetHostHold(Trellis::Host::HoldHost, Trellis::Host::ReleaseHost);
     int const status = tool.Run(std::vector<std::string>(argv + 1, argv + argc), std::cout, std::cerr);
     std::cout.flush();
     return status;

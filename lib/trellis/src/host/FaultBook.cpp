@@ -81,7 +81,7 @@ void FaultBook::Reload() {
 }
 
 void FaultBook::RefreshIfChanged() {
-    if (!loaded_ || db_.FileChangeCounter() != changeCounter_) Reload();
+    if (!loaded_ || (!held_ && db_.FileChangeCounter() != changeCounter_)) Reload();
 }
 
 std::optional<Fault> FaultBook::Hit(const std::string& operation) {

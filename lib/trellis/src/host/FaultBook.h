@@ -30,6 +30,10 @@ public:
     // After this connection changed the faults table by other means.
     void Reload();
 
+    // While the store is held, no other connection can change the faults:
+    // the cache stands without looking at the file.
+    void SetHeld(bool held) { held_ = held; }
+
     void Arm(const Fault& fault);
     void Clear();
     std::vector<Fault> List();
@@ -43,6 +47,7 @@ private:
 
     Database& db_;
     bool loaded_ = false;
+    bool held_ = false;
     std::uint32_t changeCounter_ = 0;  // of the file, when the cache was read
     std::map<std::string, Fault> armed_;
 };

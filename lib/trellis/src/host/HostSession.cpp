@@ -46,6 +46,14 @@ void CloseHost() {
     Current().reset();
 }
 
+void HoldHost() {
+    if (Current()) Current()->Hold();
+}
+
+void ReleaseHost() {
+    if (Current()) Current()->Release();
+}
+
 Store& CurrentStore() {
     if (!Current()) throw Gantry::Lib::GantryException("No host is open");
     return *Current();

@@ -1,5 +1,8 @@
 #include "trellis/host/JsonReader.h"
 
+#include <algorithm>
+#include <cstring>
+
 #include <nlohmann/json.hpp>
 
 #include "host/StoredText.h"
@@ -7,7 +10,38 @@
 namespace Trellis {
 namespace Host {
 
-JsonReader::JsonReader(const Json* value, std::string path) : value_(value), path_(std::move(path)) {}
+JsonReader::JsonReader(const Json* value, std::string path)
+    : value_(value), place_(std::make_shared<const Place>(Place{nullptr, std::move(path), 0})) {}
+
+JsonReader::JsonReader(const Json* value, std::shared_ptr<const Place> place)
+    : value_(value), place_(std::move(place)) {}
+
+JsonReader JsonReader::Child(const Json* value, const std::string& key) const {
+    return JsonReader(value, std::make_shared<const Place>(Place{place_, key, 0}));
+}
+
+std::string JsonReader::Path() const {
+    // The places from the top level down to this one.
+    std::vector<const Place*> chain;
+    for (const Place* place = place_.get(); place; place = place->parent.get()) chain.push_back(place);
+    std::string path;
+    for (auto it = chain.rbegin(); it != chain.rend(); ++it) {
+        const Place& place = **it;
+        if (!place.parent) {
+            path = place.key;
+        } else if (place.key.empty()) {
+            path += "[" + std::to_string(place.index) + "]";
+        } else {
+            path += (path.empty() ? "" : ".") + place.key;
+        }
+    }
+    return path;
+}
+
+std::string JsonReader::PathOf(const std::string& key) const {
+    std::string path = Path();
+    return path.empty() ? key : path + "." + key;
+}
 
 const Json& JsonReader::Value() const {
     if (!value_) Fail("missing required field");
@@ -15,7 +49,12 @@ const Json& JsonReader::Value() const {
 }
 
 void JsonReader::Fail(const std::string& problem) const {
-    throw DescriptionError((path_.empty() ? std::string("top level") : path_) + ": " + problem);
+    std::string path = Path();
+    throw DescriptionError((path.empty() ? std::string("top level") : path) + ": " + problem);
+}
+
+void JsonReader::FailAt(const std::string& key, const std::string& problem) const {
+    throw DescriptionError(PathOf(key) + ": " + problem);
 }
 
 void JsonReader::ExpectObject() const {
@@ -30,35 +69,35 @@ std::string JsonReader::AsString() const {
     return text;
 }
 
-std::string JsonReader::PathOf(const std::string& key) const {
-    return path_.empty() ? key : path_ + "." + key;
-}
-
 const Json* JsonReader::Find(const char* key) const {
     ExpectObject();
-    used_.insert(key);
+    if (std::find(used_.begin(), used_.end(), key) == used_.end()) used_.push_back(key);
     auto it = value_->find(key);
     return it == value_->end() ? nullptr : &*it;
 }
 
 const Json& JsonReader::Required(const char* key) const {
     const Json* member = Find(key);
-    if (!member) JsonReader(nullptr, PathOf(key)).Fail("missing required field");
+    if (!member) FailAt(key, "missing required field");
     return *member;
 }
 
 std::string JsonReader::String(const char* key) const {
-    return JsonReader(&Required(key), PathOf(key)).AsString();
+    const Json& member = Required(key);
+    if (!member.is_string()) FailAt(key, "expected a string");
+    std::string text = member.get<std::string>();
+    std::string problem = TextProblem(text);
+    if (!problem.empty()) FailAt(key, "the text " + problem);
+    return text;
 }
 
 std::string JsonReader::String(const char* key, const std::string& fallback) const {
-    const Json* member = Find(key);
-    return member ? JsonReader(member, PathOf(key)).AsString() : fallback;
+    return Find(key) ? String(key) : fallback;
 }
 
 bool JsonReader::Bool(const char* key) const {
     const Json& member = Required(key);
-    if (!member.is_boolean()) JsonReader(&member, PathOf(key)).Fail("expected true or false");
+    if (!member.is_boolean()) FailAt(key, "expected true or false");
     return member.get<bool>();
 }
 
@@ -75,29 +114,35 @@ std::int64_t JsonReader::Int(const char* key, std::int64_t min, std::int64_t max
         inRange = true;
     }
     if (!inRange || value < min || value > max)
-        JsonReader(&member, PathOf(key))
-            .Fail("expected an integer from " + std::to_string(min) + " to " + std::to_string(max));
+        FailAt(key, "expected an integer from " + std::to_string(min) + " to " + std::to_string(max));
     return value;
 }
 
-std::size_t JsonReader::Word(const char* key, const std::vector<std::string>& words) const {
+std::size_t JsonReader::Word(const char* key, const char* const* words, std::size_t count) const {
     const Json& member = Required(key);
     if (member.is_string()) {
-        for (std::size_t i = 0; i < words.size(); ++i)
-            if (member.get<std::string>() == words[i]) return i;
+        const std::string& text = member.get_ref<const std::string&>();
+        for (std::size_t i = 0; i < count; ++i)
+            if (text == words[i]) return i;
     }
     std::string expected;
-    for (std::size_t i = 0; i < words.size(); ++i)
-        expected += (i == 0 ? "" : i + 1 == words.size() ? " or " : ", ") + Quoted(words[i]);
-    JsonReader(&member, PathOf(key)).Fail("expected " + expected);
+    for (std::size_t i = 0; i < count; ++i)
+        expected += (i == 0 ? "" : i + 1 == count ? " or " : ", ") + Quoted(words[i]);
+    FailAt(key, "expected " + expected);
+}
+
+std::size_t JsonReader::Word(const char* key, const std::vector<std::string>& words) const {
+    std::vector<const char*> pointers;
+    for (const std::string& word : words) pointers.push_back(word.c_str());
+    return Word(key, pointers.data(), pointers.size());
 }
 
 JsonReader JsonReader::Member(const char* key) const {
-    return JsonReader(Find(key), PathOf(key));
+    return Child(Find(key), key);
 }
 
 JsonReader JsonReader::Object(const char* key) const {
-    JsonReader member(&Required(key), PathOf(key));
+    JsonReader member = Child(&Required(key), key);
     member.ExpectObject();
     return member;
 }
@@ -106,8 +151,9 @@ std::vector<JsonReader> JsonReader::Elements() const {
     std::vector<JsonReader> elements;
     if (!value_) return elements;
     if (!value_->is_array()) Fail("expected an array");
+    elements.reserve(value_->size());
     for (std::size_t i = 0; i < value_->size(); ++i)
-        elements.emplace_back(&(*value_)[i], path_ + "[" + std::to_string(i) + "]");
+        elements.push_back(JsonReader(&(*value_)[i], std::make_shared<const Place>(Place{place_, "", i})));
     return elements;
 }
 
@@ -124,7 +170,8 @@ std::vector<std::string> JsonReader::StringArray(const char* key) const {
 void JsonReader::RejectUnknownMembers() const {
     ExpectObject();
     for (auto it = value_->begin(); it != value_->end(); ++it)
-        if (!used_.count(it.key())) JsonReader(&it.value(), PathOf(Printable(it.key()))).Fail("unknown field");
+        if (std::find(used_.begin(), used_.end(), it.key()) == used_.end())
+            FailAt(Printable(it.key()), "unknown field");
 }
 
 }  // namespace Host

@@ -81,6 +81,35 @@ std::unique_ptr<Store> Store::Open(const std::string& path) {
     return store;
 }
 
+void Store::Hold() {
+    if (held_) return;
+    GuardedSql(*this, [&] {
+        db_->Execute("PRAGMA locking_mode = EXCLUSIVE");
+        try {
+            // An exclusive transaction takes the write lock at once, so that
+            // two holders never each keep a read lock the other waits for.
+            db_->Execute("BEGIN EXCLUSIVE; COMMIT");
+        } catch (const SqliteError&) {
+            db_->Execute("PRAGMA locking_mode = NORMAL");
+            throw;
+        }
+        faults_.Reload();
+    });
+    held_ = true;
+    faults_.SetHeld(true);
+}
+
+void Store::Release() {
+    if (!held_) return;
+    held_ = false;
+    faults_.SetHeld(false);
+    GuardedSql(*this, [&] {
+        db_->Execute("PRAGMA locking_mode = NORMAL");
+        // The lock goes at the next access to the file.
+        db_->QueryInt("SELECT count(*) FROM sqlite_master");
+    });
+}
+
 void Store::Migrate() {
     if (db_->QueryInt("PRAGMA user_version") == LatestSchemaVersion()) return;
     TransactionScope scope(*this, true);

@@ -27,12 +27,21 @@ public:
     FaultBook& Faults() { return faults_; }
     bool InTransaction() const { return db_->InTransaction(); }
 
+    // Holds the store's lock from now until Release: the operations in
+    // between take and drop no lock of their own, and other processes wait
+    // (up to the busy timeout) until the release. Hold throws
+    // GantryException when the lock cannot be had; both do nothing when
+    // there is nothing to do.
+    void Hold();
+    void Release();
+
 private:
     void Migrate();
 
     std::string path_;
     std::unique_ptr<Database> db_;
     FaultBook faults_;
+    bool held_ = false;
 };
 
 // Runs fn(), turning a failure of SQLite into the GantryException that

@@ -84,6 +84,17 @@ std::vector<std::pair<std::string, Json>> Transaction::ChildrenData(const std::s
     });
 }
 
+std::size_t Transaction::CountChildrenWhere(const std::string& kind, const std::string& parent, const char* field,
+                                            const std::string& value) const {
+    return GuardedSql(store_, [&] {
+        Statement query = store_.Db().Prepare(
+            "SELECT count(*) FROM records WHERE kind = ? AND parent = ? AND json_extract(data, ?) = ?");
+        query.Bind(1, kind).Bind(2, parent).Bind(3, std::string("$.\"") + field + "\"").Bind(4, value);
+        query.Step();
+        return static_cast<std::size_t>(query.Int(0));
+    });
+}
+
 std::size_t Transaction::CountChildren(const std::string& kind, const std::string& parent) const {
     return GuardedSql(store_, [&] {
         Statement query = store_.Db().Prepare("SELECT count(*) FROM records WHERE kind = ? AND parent = ?");

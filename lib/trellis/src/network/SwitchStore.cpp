@@ -43,9 +43,7 @@ std::int64_t ClientPortsOf(Transaction const& t, std::string const& vswitch) {
 }
 
 std::int64_t ActiveClientsOf(Transaction const& t, PortGroupRecord const& group) {
-    std::vector<PortRecord> ports = t.ChildrenOf<PortRecord>(group.vswitch);
-    return std::count_if(ports.begin(), ports.end(),
-                         [&](PortRecord const& port) { return port.portGroup == group.name; });
+    return static_cast<std::int64_t>(t.CountChildrenWith<PortRecord>(group.vswitch, "portGroup", group.name));
 }
 
 int UsedPortsOf(Transaction const& t, StandardSwitchRecord const& vswitch) {

@@ -30,5 +30,14 @@ void OpenHost(const std::string& path);
 // Closes the open host, if any.
 void CloseHost();
 
+// Keeps the open host to this process from HoldHost to ReleaseHost, as the
+// tool does around each command: the command's operations then run without
+// locking the host one by one, and another process that wants the host waits
+// until the release (for 10 s at most, then its operation fails). Each
+// operation is still its own transaction. Both do nothing without an open
+// host; HoldHost throws GantryException when the host stays busy.
+void HoldHost();
+void ReleaseHost();
+
 }  // namespace Host
 }  // namespace Trellis

@@ -7,7 +7,7 @@
 
 #include <cstddef>
 #include <cstdint>
-#include <set>
+#include <memory>
 #include <stdexcept>
 #include <string>
 #include <vector>
@@ -29,10 +29,14 @@ public:
 class JsonReader {
 public:
     // value may be null: the reader then stands for a member that is absent.
+    // path names where value stands, for messages ("" for the top level).
     JsonReader(const Json* value, std::string path);
 
     bool IsPresent() const { return value_ != nullptr; }
-    const std::string& Path() const { return path_; }
+    // Where the value stands, e.g. "firewall.rulesets[2].rules[0]". Built
+    // only when asked for: a reader that reads what it expects never spells
+    // out its path.
+    std::string Path() const;
     const Json& Value() const;  // fails when absent
     [[noreturn]] void Fail(const std::string& problem) const;
 
@@ -50,13 +54,14 @@ public:
     std::string String(const char* key, const std::string& fallback) const;
     bool Bool(const char* key) const;
     std::int64_t Int(const char* key, std::int64_t min, std::int64_t max) const;
-    // A string that must be one of words; returns its index.
+    // A string that must be one of the count words; returns its index.
+    std::size_t Word(const char* key, const char* const* words, std::size_t count) const;
     std::size_t Word(const char* key, const std::vector<std::string>& words) const;
     // Word as an enum whose values are the indexes of words:
     //   Direction d = in.Word<Direction>("direction", kDirectionWords);
     template <class Enum, std::size_t N>
     Enum Word(const char* key, const char* const (&words)[N]) const {
-        return static_cast<Enum>(Word(key, std::vector<std::string>(words, words + N)));
+        return static_cast<Enum>(Word(key, words, N));
     }
 
     // A member that may be absent (then the result is not IsPresent()).
@@ -72,13 +77,24 @@ public:
     void RejectUnknownMembers() const;
 
 private:
+    // Where a reader's value stands: a member of, or an element of, the
+    // place of its parent; the top level has a label of its own.
+    struct Place {
+        std::shared_ptr<const Place> parent;
+        std::string key;      // the member's key, or the label of the top level
+        std::size_t index;    // the element's index, when key is empty and parent is not null
+    };
+
+    JsonReader(const Json* value, std::shared_ptr<const Place> place);
+    JsonReader Child(const Json* value, const std::string& key) const;
+    std::string PathOf(const std::string& key) const;
+    [[noreturn]] void FailAt(const std::string& key, const std::string& problem) const;
     const Json& Required(const char* key) const;
     const Json* Find(const char* key) const;
-    std::string PathOf(const std::string& key) const;
 
     const Json* value_;
-    std::string path_;
-    mutable std::set<std::string> used_;
+    std::shared_ptr<const Place> place_;
+    mutable std::vector<std::string> used_;
 };
 
 // The word of an enum value from its table (see JsonReader::Word).

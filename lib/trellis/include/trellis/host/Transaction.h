@@ -107,6 +107,14 @@ public:
         return CountChildren(R::kKind, parent);
     }
 
+    // The count of those children whose stored field (a member of the
+    // record's JSON) holds value, counted in the store without decoding them.
+    template <class R>
+    std::size_t CountChildrenWith(const std::string& parent, const char* field, const std::string& value) const {
+        static_assert(HasParent<R>::value, "the record type declares no Parent()");
+        return CountChildrenWhere(R::kKind, parent, field, value);
+    }
+
     // Inserts the record, or replaces the one of the same name in its place.
     template <class R>
     void Put(const R& record) {
@@ -136,6 +144,8 @@ public:
     std::size_t CountOf(const std::string& kind) const;
     std::vector<std::pair<std::string, Json>> ChildrenData(const std::string& kind, const std::string& parent) const;
     std::size_t CountChildren(const std::string& kind, const std::string& parent) const;
+    std::size_t CountChildrenWhere(const std::string& kind, const std::string& parent, const char* field,
+                                   const std::string& value) const;
     void PutData(const std::string& kind, const std::string& name, const Json& data,
                  const std::optional<std::string>& parent = std::nullopt);
     bool EraseData(const std::string& kind, const std::string& name);
