@@ -46,7 +46,7 @@ exec 9>"$build/.lock"
 flock 9
 sources_changed || exit 0
 
-packages=(g++ cmake ninja-build pkg-config libboost-dev libboost-regex-dev
+packages=(g++ cmake ninja-build pkg-config libboost1.81-dev
           libsqlite3-dev nlohmann-json3-dev libgtest-dev libbenchmark-dev)
 missing=()
 for p in "${packages[@]}"; do
