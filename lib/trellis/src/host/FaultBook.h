@@ -29,6 +29,8 @@ public:
 
     // After this connection changed the faults table by other means.
     void Reload();
+    // Reads the faults again when a connection has committed since they were read.
+    void RefreshIfChanged();
 
     // While the store is held, no other connection can change the faults:
     // the cache stands without looking at the file.
@@ -43,7 +45,6 @@ public:
     static void Write(Database& db, const std::vector<Fault>& faults);
 
 private:
-    void RefreshIfChanged();
 
     Database& db_;
     bool loaded_ = false;

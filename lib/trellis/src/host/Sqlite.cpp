@@ -69,6 +69,11 @@ std::int64_t Database::QueryInt(const std::string& sql) {
     return statement.Int(0);
 }
 
+void Database::SetBusyTimeout(int milliseconds) {
+    int rc = sqlite3_busy_timeout(db_, milliseconds);
+    if (rc != SQLITE_OK) Fail(rc, "PRAGMA busy_timeout");
+}
+
 int Database::Changes() const {
     return sqlite3_changes(db_);
 }

@@ -41,6 +41,8 @@ public:
 
     // Runs one or more statements that return no rows of interest.
     void Execute(const std::string& sql);
+    // How long a statement waits for a lock that another connection holds.
+    void SetBusyTimeout(int milliseconds);
     Statement Prepare(const std::string& sql);
     // The first column of the first row of a query that returns one integer.
     std::int64_t QueryInt(const std::string& sql);

@@ -28,19 +28,29 @@ std::string Describe(const SqliteError& e) {
     }
 }
 
-// Only reads, so that a file that is refused is left as it was.
-void CheckIsHostStore(const std::string& path, Database& db) {
+bool HasTable(Database& db, const char* table) {
+    Statement query = db.Prepare("SELECT 1 FROM sqlite_master WHERE type = 'table' AND name = ?");
+    query.Bind(1, table);
+    return query.Step();
+}
+
+// Only reads, so that a file that is refused is left as it was. Returns the
+// store's schema version.
+std::int64_t CheckIsHostStore(const std::string& path, Database& db) {
     if (db.QueryInt("PRAGMA application_id") != kHostApplicationId) Refuse(path, "it is not a host store");
     std::int64_t version = db.QueryInt("PRAGMA user_version");
     if (version < 1) Refuse(path, "it is not a host store (no schema version)");
     if (version > LatestSchemaVersion())
         Refuse(path, "it was written by a newer version (schema " + std::to_string(version) +
                          ", this build knows up to " + std::to_string(LatestSchemaVersion()) + ")");
-    for (const char* table : BaseTables()) {
-        Statement query = db.Prepare("SELECT 1 FROM sqlite_master WHERE type = 'table' AND name = ?");
-        query.Bind(1, table);
-        if (!query.Step()) Refuse(path, std::string("the host store is damaged (table ") + table + " is missing)");
+    // One query answers for a store that is whole.
+    if (db.QueryInt("SELECT count(*) FROM sqlite_master WHERE type = 'table' AND name IN ('records', 'faults', "
+                    "'exec_log')") != static_cast<std::int64_t>(BaseTables().size())) {
+        for (const char* table : BaseTables())
+            if (!HasTable(db, table))
+                Refuse(path, std::string("the host store is damaged (table ") + table + " is missing)");
     }
+    return version;
 }
 
 }  // namespace
@@ -62,14 +72,14 @@ std::unique_ptr<Store> Store::Open(const std::string& path) {
     }
     std::unique_ptr<Store> store;
     try {
-        db->Execute("PRAGMA busy_timeout = " + std::to_string(kBusyTimeoutMs));
-        CheckIsHostStore(path, *db);
+        db->SetBusyTimeout(kBusyTimeoutMs);
+        std::int64_t version = CheckIsHostStore(path, *db);
         // A rollback journal, kept as an empty file between changes: reading
         // the host then writes nothing at all, where a write-ahead log would
         // create and remove its two files at every open.
         db->Execute("PRAGMA journal_mode = TRUNCATE; PRAGMA synchronous = FULL");
         store = std::make_unique<Store>(path, std::move(db));
-        store->Migrate();
+        if (version != LatestSchemaVersion()) store->Migrate();
         store->faults_.Reload();
     } catch (const SqliteError& e) {
         Refuse(path, Describe(e));
@@ -93,7 +103,8 @@ void Store::Hold() {
             db_->Execute("PRAGMA locking_mode = NORMAL");
             throw;
         }
-        faults_.Reload();
+        // Another process may have armed a fault since the host was opened.
+        faults_.RefreshIfChanged();
     });
     held_ = true;
     faults_.SetHeld(true);
@@ -111,7 +122,6 @@ void Store::Release() {
 }
 
 void Store::Migrate() {
-    if (db_->QueryInt("PRAGMA user_version") == LatestSchemaVersion()) return;
     TransactionScope scope(*this, true);
     // Read again under the write lock: another process may have migrated meanwhile.
     std::int64_t version = db_->QueryInt("PRAGMA user_version");
