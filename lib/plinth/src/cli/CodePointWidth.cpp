@@ -90,6 +90,8 @@ int CodePointWidth(char32_t codePoint) {
 }
 
 std::size_t DisplayWidth(std::string const& text) {
+    // Printable ASCII, the common case, is one column a byte.
+    if (std::all_of(text.begin(), text.end(), [](char c) { return c >= 0x20 && c < 0x7F; })) return text.size();
     std::size_t width = 0;
     std::size_t position = 0;
     char32_t codePoint = 0;

@@ -21,9 +21,11 @@ void WriteRow(std::ostream& out, std::vector<std::string> const& cells, std::vec
     std::string line;
     for (size_t i = 0; i < cells.size(); ++i) {
         if (i > 0) line += "  ";
-        line += cells[i] + std::string(widths[i] - DisplayWidth(cells[i]), ' ');
+        line += cells[i];
+        line.append(widths[i] - DisplayWidth(cells[i]), ' ');
     }
-    out << boost::algorithm::trim_right_copy(line) << "\n";
+    boost::algorithm::trim_right(line);
+    out << line << "\n";
 }
 
 std::vector<std::string> OneLineCells(std::vector<std::string> const& cells) {

@@ -53,15 +53,22 @@ TableRows MakeTableRows(boost::shared_ptr<MetaObject> const& result, boost::shar
     if (!model) return table;
     table.isTable = true;
     table.columns = hints.TableColumns(*model, true);
+    // The units of the columns, looked up again only for a structure of another name.
+    std::string unitsOf;
+    std::vector<std::string> units(table.columns.size());
     for (MetaStruct const* structure : structures) {
-        std::vector<std::string> row;
-        for (std::string const& title : table.columns) {
-            std::string cell = InlineText(structure->GetField(title), hints);
-            std::string const unit = withUnits ? hints.Unit(structure->GetName(), title) : "";
-            if (!unit.empty() && !cell.empty()) cell += " " + unit;
-            row.push_back(cell);
+        if (withUnits && (unitsOf != structure->GetName() || structure == structures.front())) {
+            unitsOf = structure->GetName();
+            for (size_t i = 0; i < table.columns.size(); ++i) units[i] = hints.Unit(unitsOf, table.columns[i]);
         }
-        table.rows.push_back(row);
+        std::vector<std::string> row;
+        row.reserve(table.columns.size());
+        for (size_t i = 0; i < table.columns.size(); ++i) {
+            std::string cell = InlineText(structure->GetField(table.columns[i]), hints);
+            if (!units[i].empty() && !cell.empty()) cell += " " + units[i];
+            row.push_back(std::move(cell));
+        }
+        table.rows.push_back(std::move(row));
     }
     return table;
 }

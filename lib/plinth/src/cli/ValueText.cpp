@@ -1,5 +1,6 @@
 #include "plinth/cli/ValueText.h"
 
+#include <algorithm>
 #include <cstdio>
 
 #include "plinth/cli/Utf8.h"
@@ -51,6 +52,9 @@ std::string InlineText(boost::shared_ptr<MetaObject> const& value, FormatHints c
 }
 
 std::string OneLineText(std::string const& text) {
+    // Printable ASCII without a backslash, the common case, stays as it is.
+    if (std::all_of(text.begin(), text.end(), [](char c) { return c >= 0x20 && c < 0x7F && c != '\\'; }))
+        return text;
     std::string escaped;
     std::size_t position = 0;
     char32_t codePoint = 0;
