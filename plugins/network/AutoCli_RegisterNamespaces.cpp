@@ -14,10 +14,22 @@
 #include "NamespaceTreeBuilder.h"
 #include "VirtualSwitchPortGroupAdd.h"
 #include "VirtualSwitchPortGroupList.h"
+#include "VirtualSwitchPortGroupPolicyFailoverGet.h"
+#include "VirtualSwitchPortGroupPolicyFailoverSet.h"
+#include "VirtualSwitchPortGroupPolicySecurityGet.h"
+#include "VirtualSwitchPortGroupPolicySecuritySet.h"
+#include "VirtualSwitchPortGroupPolicyShapingGet.h"
+#include "VirtualSwitchPortGroupPolicyShapingSet.h"
 #include "VirtualSwitchPortGroupRemove.h"
 #include "VirtualSwitchPortGroupSet.h"
 #include "VirtualSwitchStandardAdd.h"
 #include "VirtualSwitchStandardList.h"
+#include "VirtualSwitchStandardPolicyFailoverGet.h"
+#include "VirtualSwitchStandardPolicyFailoverSet.h"
+#include "VirtualSwitchStandardPolicySecurityGet.h"
+#include "VirtualSwitchStandardPolicySecuritySet.h"
+#include "VirtualSwitchStandardPolicyShapingGet.h"
+#include "VirtualSwitchStandardPolicyShapingSet.h"
 #include "VirtualSwitchStandardRemove.h"
 #include "VirtualSwitchStandardSet.h"
 #include "VirtualSwitchStandardUplinkAdd.h"
@@ -125,10 +137,16 @@ std::vector<TreeRow> NetworkTree() {
                      "Commands to manipulate network policy settings governing the given virtual switch."),
         NamespaceRow("network vswitch standard policy shaping",
                      "Commands to manipulate shaping policy setting for the given virtual switch."),
+        CommandRow<VirtualSwitchStandardPolicyShapingGet>("network vswitch standard policy shaping get"),
+        CommandRow<VirtualSwitchStandardPolicyShapingSet>("network vswitch standard policy shaping set"),
         NamespaceRow("network vswitch standard policy security",
                      "Commands to manipulate security policy setting for the given virtual switch."),
+        CommandRow<VirtualSwitchStandardPolicySecurityGet>("network vswitch standard policy security get"),
+        CommandRow<VirtualSwitchStandardPolicySecuritySet>("network vswitch standard policy security set"),
         NamespaceRow("network vswitch standard policy failover",
                      "Commands to manipulate failover policy setting for the given virtual switch."),
+        CommandRow<VirtualSwitchStandardPolicyFailoverGet>("network vswitch standard policy failover get"),
+        CommandRow<VirtualSwitchStandardPolicyFailoverSet>("network vswitch standard policy failover set"),
         NamespaceRow("network vswitch standard portgroup",
                      "Commands to list and manipulate Port Groups on an Halden host."),
         CommandRow<VirtualSwitchPortGroupList>("network vswitch standard portgroup list"),
@@ -139,10 +157,16 @@ std::vector<TreeRow> NetworkTree() {
                      "Commands to manipulate network policy settings governing the given portgroup."),
         NamespaceRow("network vswitch standard portgroup policy shaping",
                      "Commands to manipulate shaping policy setting for the given portgroup."),
+        CommandRow<VirtualSwitchPortGroupPolicyShapingGet>("network vswitch standard portgroup policy shaping get"),
+        CommandRow<VirtualSwitchPortGroupPolicyShapingSet>("network vswitch standard portgroup policy shaping set"),
         NamespaceRow("network vswitch standard portgroup policy failover",
                      "Commands to manipulate failover policy setting for the given portgroup."),
+        CommandRow<VirtualSwitchPortGroupPolicyFailoverGet>("network vswitch standard portgroup policy failover get"),
+        CommandRow<VirtualSwitchPortGroupPolicyFailoverSet>("network vswitch standard portgroup policy failover set"),
         NamespaceRow("network vswitch standard portgroup policy security",
                      "Commands to manipulate security policy setting for the given portgroup."),
+        CommandRow<VirtualSwitchPortGroupPolicySecurityGet>("network vswitch standard portgroup policy security get"),
+        CommandRow<VirtualSwitchPortGroupPolicySecuritySet>("network vswitch standard portgroup policy security set"),
         NamespaceRow("network vswitch dvs",
                      "Commands to retrieve Distributed Virtual Switch information"),
         NamespaceRow("network vswitch dvs korvex",

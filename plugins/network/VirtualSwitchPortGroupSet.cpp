@@ -1,7 +1,7 @@
 #include "VirtualSwitchPortGroupSet.h"
 
 #include "CommandSupport.h"
-#include "gantry/network/NetworkFactory.h"
+#include "PolicyTargets.h"
 #include "gantry/network/PortGroup.h"
 
 namespace KorvexCli {
@@ -39,11 +39,8 @@ void VirtualSwitchPortGroupSet::ExecuteInternal(boost::shared_ptr<Input> input, 
         std::string name = input->GetString(kPortgroupName);
         // Optional, yet read without a test: a missing id sets what GetInt gives for it.
         int vlanId = input->GetInt(kVlanId);
-        std::unique_ptr<PortGroup> portGroup(Gantry::Network::NetworkFactory::GetPortGroupByName(name));
-        if (!portGroup) {
-            output->SetError("Unable to find a port group with the name " + name);
-            return;
-        }
+        std::unique_ptr<PortGroup> portGroup = FindPortGroup(name, *output);
+        if (!portGroup) return;
         portGroup->SetVlanId(vlanId);
         output->SetResult(MetaBool::New(true));
         output->Finish();

@@ -15,12 +15,6 @@
 
 #include "FailureOf.h"
 #include "TempHost.h"
-#include "gantry/network/NetworkFactory.h"
-#include "gantry/network/NicTeamingPolicy.h"
-#include "gantry/network/PortGroup.h"
-#include "gantry/network/PortSecurityPolicy.h"
-#include "gantry/network/ShapingPolicy.h"
-#include "gantry/network/VirtualSwitch.h"
 #include "plinth/autocli/Namespace.h"
 #include "plinth/autocli/PluginEntry.h"
 #include "plinth/cli/Tool.h"
@@ -32,10 +26,6 @@
 
 namespace {
 
-using Gantry::Network::NetworkFactory;
-using Gantry::Network::NicTeamingPolicy;
-using Gantry::Network::PortSecurityPolicy;
-using Gantry::Network::ShapingPolicy;
 using Trellis::Host::Fault;
 using Trellis::Host::FaultKind;
 using Trellis::Host::Operation;
@@ -64,6 +54,10 @@ const Words kDisableDns = {"network", "firewall", "ruleset", "set", "-r", "dns",
 const Words kVswitchList = {"network", "vswitch", "standard", "list"};
 const Words kVswitchSetMtu = {"network", "vswitch", "standard", "set", "-v", "switch0", "-m", "9000"};
 const Words kPortGroupList = {"network", "vswitch", "standard", "portgroup", "list"};
+const Words kSwitchFailoverSet = {"network", "vswitch", "standard", "policy", "failover", "set", "-v", "switch0", "-a", "pnet0"};
+const Words kGroupSecurityGet = {"network", "vswitch", "standard", "portgroup", "policy", "security", "get", "-p", "Guest Network"};
+const Words kGroupShapingGet = {"network", "vswitch", "standard", "portgroup", "policy", "shaping", "get", "-p", "Guest Network"};
+const Words kGroupFailoverGet = {"network", "vswitch", "standard", "portgroup", "policy", "failover", "get", "-p", "Guest Network"};
 
 std::string UnloadedFirewall() {
     return TempHost::Edited([](TempHost::Json& d) {
@@ -158,16 +152,32 @@ const std::vector<CommandRow>& CommandTable() {
          {"network", "vswitch", "standard", "portgroup", "set", "-p", "Guest Network", "-v", "10"}},
         {"PortGroup::SetVlanId",
          {"network", "vswitch", "standard", "portgroup", "set", "-p", "Guest Network", "-v", "10"}},
+
+        {"VirtualSwitch::GetSecurityPolicy", {"network", "vswitch", "standard", "policy", "security", "get", "-v", "switch0"}},
+        {"VirtualSwitch::ApplySecurityPolicy",
+         {"network", "vswitch", "standard", "policy", "security", "set", "-v", "switch0", "-p", "true"}},
+        {"VirtualSwitch::GetShapingPolicy", {"network", "vswitch", "standard", "policy", "shaping", "get", "-v", "switch0"}},
+        {"VirtualSwitch::ApplyShapingPolicy",
+         {"network", "vswitch", "standard", "policy", "shaping", "set", "-v", "switch0", "-e", "false"}},
+        {"VirtualSwitch::GetTeamingPolicy", {"network", "vswitch", "standard", "policy", "failover", "get", "-v", "switch0"}},
+        {"VirtualSwitch::GetLocalTeamingPolicy", kSwitchFailoverSet},
+        {"VirtualSwitch::ApplyTeamingPolicy", kSwitchFailoverSet},
+        {"PnicImpl::IsValidPnic", kSwitchFailoverSet},
+        {"PortGroup::GetSecurityPolicy", kGroupSecurityGet},
+        {"PortGroup::GetLocalSecurityPolicy", kGroupSecurityGet},
+        {"PortGroup::ApplySecurityPolicy",
+         {"network", "vswitch", "standard", "portgroup", "policy", "security", "set", "-p", "Guest Network", "-o", "true"}},
+        {"PortGroup::GetShapingPolicy", kGroupShapingGet},
+        {"PortGroup::GetLocalShapingPolicy", kGroupShapingGet},
+        {"PortGroup::GetVirtualSwitch", kGroupShapingGet},
+        {"PortGroup::ApplyShapingPolicy",
+         {"network", "vswitch", "standard", "portgroup", "policy", "shaping", "set", "-p", "Guest Network", "-e", "false"}},
+        {"PortGroup::GetTeamingPolicy", kGroupFailoverGet},
+        {"PortGroup::GetLocalTeamingPolicy", kGroupFailoverGet},
+        {"PortGroup::ApplyTeamingPolicy",
+         {"network", "vswitch", "standard", "portgroup", "policy", "failover", "set", "-p", "Guest Network", "-b", "true"}},
     };
     return rows;
-}
-
-std::unique_ptr<Gantry::Network::VirtualSwitch> Switch0() {
-    return std::unique_ptr<Gantry::Network::VirtualSwitch>(NetworkFactory::GetVirtualSwitchById("switch0"));
-}
-
-std::unique_ptr<Gantry::Network::PortGroup> GuestNetwork() {
-    return std::unique_ptr<Gantry::Network::PortGroup>(NetworkFactory::GetPortGroupByName("Guest Network"));
 }
 
 std::function<std::string()> Thrown(std::function<void()> call) {
@@ -176,37 +186,9 @@ std::function<std::string()> Thrown(std::function<void()> call) {
 
 // Operations that no built command reaches, called through their facade or
 // host object on the default host. A row moves to the command table when a
-// command that reaches its operation is built (the policy get and set
-// commands of switches and port groups, for most of them).
+// command that reaches its operation is built.
 const std::vector<DirectRow>& DirectTable() {
     static const std::vector<DirectRow> rows = {
-        {"VirtualSwitch::GetSecurityPolicy", Thrown([] { Switch0()->GetSecurityPolicy(); })},
-        {"VirtualSwitch::ApplySecurityPolicy",
-         Thrown([] { Switch0()->ApplySecurityPolicy(PortSecurityPolicy::GetDefaultPolicy()); })},
-        {"VirtualSwitch::GetShapingPolicy", Thrown([] { Switch0()->GetShapingPolicy(); })},
-        {"VirtualSwitch::ApplyShapingPolicy",
-         Thrown([] { Switch0()->ApplyShapingPolicy(ShapingPolicy::GetDefaultPolicy()); })},
-        {"VirtualSwitch::GetTeamingPolicy", Thrown([] { Switch0()->GetTeamingPolicy(); })},
-        {"VirtualSwitch::GetLocalTeamingPolicy", Thrown([] { Switch0()->GetLocalTeamingPolicy(); })},
-        {"VirtualSwitch::ApplyTeamingPolicy",
-         Thrown([] { Switch0()->ApplyTeamingPolicy(NicTeamingPolicy::GetDefaultPolicy()); })},
-        {"PortGroup::GetSecurityPolicy", Thrown([] { GuestNetwork()->GetSecurityPolicy(); })},
-        {"PortGroup::GetLocalSecurityPolicy", Thrown([] { GuestNetwork()->GetLocalSecurityPolicy(); })},
-        {"PortGroup::ApplySecurityPolicy",
-         Thrown([] { GuestNetwork()->ApplySecurityPolicy(PortSecurityPolicy::GetDefaultPolicy()); })},
-        {"PortGroup::GetShapingPolicy", Thrown([] { GuestNetwork()->GetShapingPolicy(); })},
-        {"PortGroup::GetLocalShapingPolicy", Thrown([] { GuestNetwork()->GetLocalShapingPolicy(); })},
-        {"PortGroup::ApplyShapingPolicy",
-         Thrown([] { GuestNetwork()->ApplyShapingPolicy(ShapingPolicy::GetDefaultPolicy()); })},
-        {"PortGroup::GetTeamingPolicy", Thrown([] { GuestNetwork()->GetTeamingPolicy(); })},
-        {"PortGroup::GetLocalTeamingPolicy", Thrown([] { GuestNetwork()->GetLocalTeamingPolicy(); })},
-        {"PortGroup::ApplyTeamingPolicy",
-         Thrown([] { GuestNetwork()->ApplyTeamingPolicy(NicTeamingPolicy::GetDefaultPolicy()); })},
-        {"PortGroup::GetVirtualSwitch",
-         Thrown([] { std::unique_ptr<Gantry::Network::VirtualSwitch>(GuestNetwork()->GetVirtualSwitch()); })},
-        // The failover set commands check the NICs they are given with it.
-        {"PnicImpl::IsValidPnic", Thrown([] { Trellis::Network::PnicImpl::IsValidPnic("pnet0"); })},
-        // No command looks a NIC up by its name yet.
         {"NetworkInfoImpl::GetPnicByName", Thrown([] {
              std::unique_ptr<Gantry::Network::Pnic>(Trellis::Network::NetworkInfoImpl().GetPnicByName("pnet0"));
          })},

@@ -124,8 +124,9 @@ void PortGroupImpl::ApplyTeamingPolicy(Gantry::Network::NicTeamingPolicy const& 
 }
 
 void PortGroupImpl::ApplyShapingPolicy(Gantry::Network::ShapingPolicy const& policy) {
-    snapshot_ = StorePolicy(kApplyShapingPolicy, snapshot_.name,
-                            [&](StoredPolicies& policies) { policies.shaping = policy; });
+    snapshot_ = StorePolicy(kApplyShapingPolicy, snapshot_.name, [&](StoredPolicies& policies) {
+        policies.shaping = SwitchStore::StorableShapingPolicy(policy, "port group " + snapshot_.name);
+    });
 }
 
 Gantry::Network::VirtualSwitch* PortGroupImpl::GetVirtualSwitch() {

@@ -1,6 +1,7 @@
 #include "SwitchStore.h"
 
 #include <algorithm>
+#include <cstdint>
 
 #include "PolicyInheritance.h"
 #include "gantry/lib/GantryException.h"
@@ -79,6 +80,25 @@ Gantry::Network::NicTeamingPolicy StorableTeamingPolicy(Gantry::Network::NicTeam
                                             " in the teaming policy of " + owner + ": ");
     policy.setMask &= ~NicTeamingPolicy::MASK_RESERVED0;
     policy.reserved0 = false;
+    return policy;
+}
+
+Gantry::Network::ShapingPolicy StorableShapingPolicy(Gantry::Network::ShapingPolicy const& policy,
+                                                     std::string const& owner) {
+    using Gantry::Network::ShapingPolicy;
+    struct Value {
+        std::uint32_t bit;
+        std::uint64_t value;
+        const char* what;
+    };
+    for (Value const& v : {Value{ShapingPolicy::MASK_AVERAGE_BPS, policy.averageBps, "average bandwidth"},
+                           Value{ShapingPolicy::MASK_PEAK_BPS, policy.peakBps, "peak bandwidth"},
+                           Value{ShapingPolicy::MASK_BURST_SIZE, policy.burstSize, "burst size"}}) {
+        if ((policy.setMask & v.bit) != 0 && v.value > static_cast<std::uint64_t>(INT64_MAX))
+            Refuse("Invalid " + std::string(v.what) + " " + std::to_string(v.value) + " for " + owner +
+                   ": the host keeps at most " + std::to_string(INT64_MAX) +
+                   (v.bit == ShapingPolicy::MASK_BURST_SIZE ? " bytes" : " bits per second"));
+    }
     return policy;
 }
 

@@ -49,6 +49,11 @@ Trellis::Host::StoredPolicies PortGroupPolicies(Trellis::Host::Transaction const
 Gantry::Network::NicTeamingPolicy StorableTeamingPolicy(Gantry::Network::NicTeamingPolicy policy,
                                                         std::string const& owner);
 
+// The shaping policy as the host stores it for owner: refuses a set
+// bandwidth or burst size at or above 2^63, which a get could not show.
+Gantry::Network::ShapingPolicy StorableShapingPolicy(Gantry::Network::ShapingPolicy const& policy,
+                                                     std::string const& owner);
+
 }  // namespace SwitchStore
 }  // namespace Network
 }  // namespace Trellis

@@ -207,7 +207,9 @@ Gantry::Network::ShapingPolicy VirtualSwitchImpl::GetShapingPolicy() {
 }
 
 void VirtualSwitchImpl::ApplyShapingPolicy(Gantry::Network::ShapingPolicy const& policy) {
-    Update(kApplyShapingPolicy, [&](Transaction&, StandardSwitchRecord& record) { record.policies.shaping = policy; });
+    Update(kApplyShapingPolicy, [&](Transaction&, StandardSwitchRecord& record) {
+        record.policies.shaping = SwitchStore::StorableShapingPolicy(policy, "virtual switch " + name_);
+    });
 }
 
 Gantry::Network::NicTeamingPolicy VirtualSwitchImpl::GetTeamingPolicy() {

@@ -25,10 +25,10 @@ constexpr const char* kFailureDetectionWords[] = {"link", "beacon"};
 
 bool IsSet(std::uint32_t mask, std::uint32_t bit) { return (mask & bit) != 0; }
 
-std::uint64_t ReadUnsigned64(const JsonReader& in, const char* key) {
-    JsonReader member = in.Member(key);
-    if (!member.Value().is_number_unsigned()) member.Fail("expected an integer from 0 to 18446744073709551615");
-    return member.Value().get<std::uint64_t>();
+// A bandwidth or burst size: the host keeps what a get can show as a signed
+// 64-bit number.
+std::uint64_t ReadShapingValue(const JsonReader& in, const char* key) {
+    return static_cast<std::uint64_t>(in.Int(key, 0, INT64_MAX));
 }
 
 Json TeamingToJson(const NicTeamingPolicy& policy) {
@@ -107,9 +107,9 @@ ShapingPolicy ShapingFromJson(const JsonReader& in) {
     if (!in.IsPresent()) return policy;
     in.ExpectObject();
     if (in.Member("enabled").IsPresent()) policy.SetEnabled(in.Bool("enabled"));
-    if (in.Member("averageBps").IsPresent()) policy.SetAverageBps(ReadUnsigned64(in, "averageBps"));
-    if (in.Member("peakBps").IsPresent()) policy.SetPeakBps(ReadUnsigned64(in, "peakBps"));
-    if (in.Member("burstSize").IsPresent()) policy.SetBurstSize(ReadUnsigned64(in, "burstSize"));
+    if (in.Member("averageBps").IsPresent()) policy.SetAverageBps(ReadShapingValue(in, "averageBps"));
+    if (in.Member("peakBps").IsPresent()) policy.SetPeakBps(ReadShapingValue(in, "peakBps"));
+    if (in.Member("burstSize").IsPresent()) policy.SetBurstSize(ReadShapingValue(in, "burstSize"));
     in.RejectUnknownMembers();
     return policy;
 }
