@@ -40,6 +40,18 @@ $c network vswitch standard uplink remove -v bench0 -u pnet1
 $c network vswitch standard portgroup add -p BenchGroup -v bench0
 $c network vswitch standard portgroup set -p BenchGroup -v 10
 $c network vswitch standard portgroup list
+$c network vswitch standard policy failover get -v switch0
+$c network vswitch standard policy failover set -v switch0 -l portid
+$c network vswitch standard policy security get -v switch0
+$c network vswitch standard policy security set -v switch0 -p false
+$c network vswitch standard policy shaping get -v switch0
+$c network vswitch standard policy shaping set -v switch0 -e false
+$c network vswitch standard portgroup policy failover get -p "Guest Network"
+$c network vswitch standard portgroup policy failover set -p "Guest Network" -u
+$c network vswitch standard portgroup policy security get -p "Guest Network"
+$c network vswitch standard portgroup policy security set -p "Guest Network" -u
+$c network vswitch standard portgroup policy shaping get -p "Guest Network"
+$c network vswitch standard portgroup policy shaping set -p "Guest Network" -u
 $c network vswitch standard portgroup remove -p BenchGroup -v bench0
 $c network vswitch standard remove -v bench0
 $c network firewall unload
