@@ -33,6 +33,33 @@ long long Shown(std::uint64_t value, long long unit) { return static_cast<long l
 
 }  // namespace
 
+void DeclareFailoverFields(MetaStruct& result) {
+    result.SetField("Load Balancing", MetaString::New());
+    result.SetField("Network Failure Detection", MetaString::New());
+    result.SetField("Notify Switches", MetaBool::New());
+    result.SetField("Failback", MetaBool::New());
+    result.SetField("Active Adapters", MetaList::New(2));
+    result.SetField("Standby Adapters", MetaList::New(2));
+    result.SetField("Unused Adapters", MetaList::New(2));
+}
+
+void DeclareSecurityFields(MetaStruct& result) {
+    result.SetField("Allow Promiscuous", MetaBool::New());
+    result.SetField("Allow MAC Address Change", MetaBool::New());
+    result.SetField("Allow Forged Transmits", MetaBool::New());
+}
+
+void DeclareShapingFields(MetaStruct& result) {
+    result.SetField("Enabled", MetaBool::New());
+    result.SetField("Average Bandwidth", MetaInt::New());
+    result.SetField("Peak Bandwidth", MetaInt::New());
+    result.SetField("Burst Size", MetaInt::New());
+}
+
+void DeclareOverrideFields(MetaStruct& result, std::vector<char const*> const& titles) {
+    for (char const* title : titles) result.SetField(title, MetaBool::New());
+}
+
 void SetFailoverFields(MetaStruct& result, NicTeamingPolicy const& inForce, std::vector<std::string> const& connected) {
     std::vector<std::string> const& order = inForce.uplinkOrder;
     std::vector<std::string> active;

@@ -13,6 +13,13 @@ namespace NetworkNamespace {
 
 // How the policy get commands of switches and port groups show a policy.
 
+// The fields of each policy, declared without values, in the order the get
+// commands show them; the port group's override flags after them.
+void DeclareFailoverFields(MetaStruct& result);
+void DeclareSecurityFields(MetaStruct& result);
+void DeclareShapingFields(MetaStruct& result);
+void DeclareOverrideFields(MetaStruct& result, std::vector<char const*> const& titles);
+
 // Load Balancing, Network Failure Detection, Notify Switches, Failback and
 // the Active, Standby and Unused Adapters, from the policy in force and the
 // NICs connected to the switch.

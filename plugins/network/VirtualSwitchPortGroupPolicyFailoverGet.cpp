@@ -36,38 +36,24 @@ boost::shared_ptr<OutputSpec> VirtualSwitchPortGroupPolicyFailoverGet::GetOutput
 
 boost::shared_ptr<MetaStruct> VirtualSwitchPortGroupPolicyFailoverGet::GetOutputStructure() {
     boost::shared_ptr<MetaStruct> result = MetaStruct::New("PortGroupFailoverPolicy");
-    result->SetField("Load Balancing", MetaString::New());
-    result->SetField("Network Failure Detection", MetaString::New());
-    result->SetField("Notify Switches", MetaBool::New());
-    result->SetField("Failback", MetaBool::New());
-    result->SetField("Active Adapters", MetaList::New(2));
-    result->SetField("Standby Adapters", MetaList::New(2));
-    result->SetField("Unused Adapters", MetaList::New(2));
-    result->SetField("Override Vswitch Load Balancing", MetaBool::New());
-    result->SetField("Override Vswitch Network Failure Detection", MetaBool::New());
-    result->SetField("Override Vswitch Notify Switches", MetaBool::New());
-    result->SetField("Override Vswitch Failback", MetaBool::New());
-    result->SetField("Override Vswitch Uplinks", MetaBool::New());
+    DeclareFailoverFields(*result);
+    DeclareOverrideFields(*result, {"Override Vswitch Load Balancing", "Override Vswitch Network Failure Detection",
+                                    "Override Vswitch Notify Switches", "Override Vswitch Failback",
+                                    "Override Vswitch Uplinks"});
     return result;
 }
 
 void VirtualSwitchPortGroupPolicyFailoverGet::ExecuteInternal(boost::shared_ptr<Input> input,
                                                               boost::shared_ptr<Output> output) {
-    try {
-        std::string name = input->GetString(kPortgroupName);
-        std::unique_ptr<Gantry::Network::PortGroup> portGroup = FindPortGroup(name, *output);
-        if (!portGroup) return;
-        std::unique_ptr<Gantry::Network::VirtualSwitch> vswitch(portGroup->GetVirtualSwitch());
-        Gantry::Network::NicTeamingPolicy inForce = portGroup->GetTeamingPolicy();
-        Gantry::Network::NicTeamingPolicy local = portGroup->GetLocalTeamingPolicy();
+    RunOnPortGroup(*input, *output, kPortgroupName, [&](Gantry::Network::PortGroup& portGroup) {
+        std::unique_ptr<Gantry::Network::VirtualSwitch> vswitch(portGroup.GetVirtualSwitch());
+        Gantry::Network::NicTeamingPolicy inForce = portGroup.GetTeamingPolicy();
+        Gantry::Network::NicTeamingPolicy local = portGroup.GetLocalTeamingPolicy();
         boost::shared_ptr<MetaStruct> result = GetOutputStructure();
         SetFailoverFields(*result, inForce, vswitch->GetUplinks());
         SetFailoverOverrides(*result, local);
-        output->SetResult(result);
-        output->Finish();
-    } catch (GantryException& e) {
-        output->SetError(e.GetMessage(0));
-    }
+        return result;
+    });
 }
 
 }  // namespace NetworkNamespace

@@ -39,24 +39,18 @@ boost::shared_ptr<OutputSpec> VirtualSwitchPortGroupPolicyFailoverSet::GetOutput
 
 void VirtualSwitchPortGroupPolicyFailoverSet::ExecuteInternal(boost::shared_ptr<Input> input,
                                                               boost::shared_ptr<Output> output) {
-    try {
-        std::string name = input->GetString(kPortgroupName);
-        std::unique_ptr<Gantry::Network::PortGroup> portGroup = FindPortGroup(name, *output);
-        if (!portGroup) return;
+    RunOnPortGroup(*input, *output, kPortgroupName, [&](Gantry::Network::PortGroup& portGroup) {
         // The reference is taken before the reset, so that it still shows the
         // overrides that the reset is about to remove.
-        Gantry::Network::NicTeamingPolicy local = portGroup->GetLocalTeamingPolicy();
-        Gantry::Network::NicTeamingPolicy reference = portGroup->GetTeamingPolicy();
-        std::unique_ptr<Gantry::Network::VirtualSwitch> vswitch(portGroup->GetVirtualSwitch());
+        Gantry::Network::NicTeamingPolicy local = portGroup.GetLocalTeamingPolicy();
+        Gantry::Network::NicTeamingPolicy reference = portGroup.GetTeamingPolicy();
+        std::unique_ptr<Gantry::Network::VirtualSwitch> vswitch(portGroup.GetVirtualSwitch());
         std::vector<std::string> connected = vswitch->GetUplinks();
         if (input->GetFlag(kUseVswitch)) local.UnsetAll();
         SetFailoverPolicy(input, output, local, reference, connected);
-        if (!output->HasError()) portGroup->ApplyTeamingPolicy(local);
-        output->SetResult(MetaBool::New(true));
-        output->Finish();
-    } catch (GantryException& e) {
-        output->SetError(e.GetMessage(0));
-    }
+        if (!output->HasError()) portGroup.ApplyTeamingPolicy(local);
+        return MetaBool::New(true);
+    });
 }
 
 }  // namespace NetworkNamespace

@@ -35,30 +35,22 @@ boost::shared_ptr<OutputSpec> VirtualSwitchPortGroupPolicySecurityGet::GetOutput
 
 boost::shared_ptr<MetaStruct> VirtualSwitchPortGroupPolicySecurityGet::GetOutputStructure() {
     boost::shared_ptr<MetaStruct> result = MetaStruct::New("PortGroupSecurityPolicy");
-    for (char const* title : {"Allow Promiscuous", "Allow MAC Address Change", "Allow Forged Transmits",
-                              "Override Vswitch Allow Promiscuous", "Override Vswitch Allow MAC Address Change",
-                              "Override Vswitch Allow Forged Transmits"}) {
-        result->SetField(title, MetaBool::New());
-    }
+    DeclareSecurityFields(*result);
+    DeclareOverrideFields(*result, {"Override Vswitch Allow Promiscuous", "Override Vswitch Allow MAC Address Change",
+                                    "Override Vswitch Allow Forged Transmits"});
     return result;
 }
 
 void VirtualSwitchPortGroupPolicySecurityGet::ExecuteInternal(boost::shared_ptr<Input> input,
                                                               boost::shared_ptr<Output> output) {
-    try {
-        std::string name = input->GetString(kPortgroupName);
-        std::unique_ptr<Gantry::Network::PortGroup> portGroup = FindPortGroup(name, *output);
-        if (!portGroup) return;
-        Gantry::Network::PortSecurityPolicy inForce = portGroup->GetSecurityPolicy();
-        Gantry::Network::PortSecurityPolicy local = portGroup->GetLocalSecurityPolicy();
+    RunOnPortGroup(*input, *output, kPortgroupName, [&](Gantry::Network::PortGroup& portGroup) {
+        Gantry::Network::PortSecurityPolicy inForce = portGroup.GetSecurityPolicy();
+        Gantry::Network::PortSecurityPolicy local = portGroup.GetLocalSecurityPolicy();
         boost::shared_ptr<MetaStruct> result = GetOutputStructure();
         SetSecurityFields(*result, inForce);
         SetSecurityOverrides(*result, local);
-        output->SetResult(result);
-        output->Finish();
-    } catch (GantryException& e) {
-        output->SetError(e.GetMessage(0));
-    }
+        return result;
+    });
 }
 
 }  // namespace NetworkNamespace

@@ -37,19 +37,13 @@ boost::shared_ptr<OutputSpec> VirtualSwitchPortGroupPolicySecuritySet::GetOutput
 
 void VirtualSwitchPortGroupPolicySecuritySet::ExecuteInternal(boost::shared_ptr<Input> input,
                                                               boost::shared_ptr<Output> output) {
-    try {
-        std::string name = input->GetString(kPortgroupName);
-        std::unique_ptr<Gantry::Network::PortGroup> portGroup = FindPortGroup(name, *output);
-        if (!portGroup) return;
-        Gantry::Network::PortSecurityPolicy local = portGroup->GetLocalSecurityPolicy();
+    RunOnPortGroup(*input, *output, kPortgroupName, [&](Gantry::Network::PortGroup& portGroup) {
+        Gantry::Network::PortSecurityPolicy local = portGroup.GetLocalSecurityPolicy();
         if (input->GetFlag(kUseVswitch)) local.UnsetAll();
         SetSecurityPolicy(input, output, local);
-        if (!output->HasError()) portGroup->ApplySecurityPolicy(local);
-        output->SetResult(MetaBool::New(true));
-        output->Finish();
-    } catch (GantryException& e) {
-        output->SetError(e.GetMessage(0));
-    }
+        if (!output->HasError()) portGroup.ApplySecurityPolicy(local);
+        return MetaBool::New(true);
+    });
 }
 
 }  // namespace NetworkNamespace

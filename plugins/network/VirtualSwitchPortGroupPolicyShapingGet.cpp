@@ -37,36 +37,24 @@ boost::shared_ptr<OutputSpec> VirtualSwitchPortGroupPolicyShapingGet::GetOutputS
 
 boost::shared_ptr<MetaStruct> VirtualSwitchPortGroupPolicyShapingGet::GetOutputStructure() {
     boost::shared_ptr<MetaStruct> result = MetaStruct::New("PortGroupTrafficShapingPolicy");
-    result->SetField("Enabled", MetaBool::New());
-    result->SetField("Average Bandwidth", MetaInt::New());
-    result->SetField("Peak Bandwidth", MetaInt::New());
-    result->SetField("Burst Size", MetaInt::New());
-    for (char const* title : {"Override Vswitch Enabled", "Override Vswitch Average Bandwidth",
-                              "Override Vswitch Peak Bandwidth", "Override Vswitch Burst Size"}) {
-        result->SetField(title, MetaBool::New());
-    }
+    DeclareShapingFields(*result);
+    DeclareOverrideFields(*result, {"Override Vswitch Enabled", "Override Vswitch Average Bandwidth",
+                                    "Override Vswitch Peak Bandwidth", "Override Vswitch Burst Size"});
     return result;
 }
 
 void VirtualSwitchPortGroupPolicyShapingGet::ExecuteInternal(boost::shared_ptr<Input> input,
                                                              boost::shared_ptr<Output> output) {
-    try {
-        std::string name = input->GetString(kPortgroupName);
-        std::unique_ptr<Gantry::Network::PortGroup> portGroup = FindPortGroup(name, *output);
-        if (!portGroup) return;
+    RunOnPortGroup(*input, *output, kPortgroupName, [&](Gantry::Network::PortGroup& portGroup) {
         // Taken and given back: the values come from the group.
-        std::unique_ptr<Gantry::Network::VirtualSwitch> vswitch(portGroup->GetVirtualSwitch());
-        vswitch.reset();
-        Gantry::Network::ShapingPolicy inForce = portGroup->GetShapingPolicy();
-        Gantry::Network::ShapingPolicy local = portGroup->GetLocalShapingPolicy();
+        std::unique_ptr<Gantry::Network::VirtualSwitch>(portGroup.GetVirtualSwitch());
+        Gantry::Network::ShapingPolicy inForce = portGroup.GetShapingPolicy();
+        Gantry::Network::ShapingPolicy local = portGroup.GetLocalShapingPolicy();
         boost::shared_ptr<MetaStruct> result = GetOutputStructure();
         SetShapingFields(*result, inForce);
         SetShapingOverrides(*result, local);
-        output->SetResult(result);
-        output->Finish();
-    } catch (GantryException& e) {
-        output->SetError(e.GetMessage(0));
-    }
+        return result;
+    });
 }
 
 }  // namespace NetworkNamespace

@@ -60,22 +60,16 @@ boost::shared_ptr<OutputSpec> VirtualSwitchPortGroupPolicyShapingSet::GetOutputS
 
 void VirtualSwitchPortGroupPolicyShapingSet::ExecuteInternal(boost::shared_ptr<Input> input,
                                                              boost::shared_ptr<Output> output) {
-    try {
-        std::string name = input->GetString(kPortgroupName);
-        std::unique_ptr<Gantry::Network::PortGroup> portGroup = FindPortGroup(name, *output);
-        if (!portGroup) return;
-        ShapingPolicy local = portGroup->GetLocalShapingPolicy();
+    RunOnPortGroup(*input, *output, kPortgroupName, [&](Gantry::Network::PortGroup& portGroup) {
+        ShapingPolicy local = portGroup.GetLocalShapingPolicy();
         if (input->GetFlag(kUseVswitch)) local.UnsetAll();
         SetShapingPolicy(input, output, local, false);
         if ((local.setMask & ShapingPolicy::MASK_ENABLED) != 0 && local.enabled) {
-            ReportValuesSetNowhere(local, portGroup->GetShapingPolicy(), *output);
+            ReportValuesSetNowhere(local, portGroup.GetShapingPolicy(), *output);
         }
-        if (!output->HasError()) portGroup->ApplyShapingPolicy(local);
-        output->SetResult(MetaBool::New(true));
-        output->Finish();
-    } catch (GantryException& e) {
-        output->SetError(e.GetMessage(0));
-    }
+        if (!output->HasError()) portGroup.ApplyShapingPolicy(local);
+        return MetaBool::New(true);
+    });
 }
 
 }  // namespace NetworkNamespace

@@ -34,31 +34,19 @@ boost::shared_ptr<OutputSpec> VirtualSwitchStandardPolicyFailoverGet::GetOutputS
 
 boost::shared_ptr<MetaStruct> VirtualSwitchStandardPolicyFailoverGet::GetOutputStructure() {
     boost::shared_ptr<MetaStruct> result = MetaStruct::New("VirtualSwitchFailoverPolicy");
-    result->SetField("Load Balancing", MetaString::New());
-    result->SetField("Network Failure Detection", MetaString::New());
-    result->SetField("Notify Switches", MetaBool::New());
-    result->SetField("Failback", MetaBool::New());
-    result->SetField("Active Adapters", MetaList::New(2));
-    result->SetField("Standby Adapters", MetaList::New(2));
-    result->SetField("Unused Adapters", MetaList::New(2));
+    DeclareFailoverFields(*result);
     return result;
 }
 
 void VirtualSwitchStandardPolicyFailoverGet::ExecuteInternal(boost::shared_ptr<Input> input,
                                                              boost::shared_ptr<Output> output) {
     Trellis::Network::VirtualSwitchInfoImpl vswitchInfo;
-    try {
-        std::string name = input->GetString(kVswitchName);
-        boost::shared_ptr<MetaStruct> result = GetOutputStructure();
-        std::unique_ptr<Gantry::Network::VirtualSwitch> vswitch = FindLegacyVirtualSwitch(vswitchInfo, name, *output);
-        if (!vswitch) return;
-        Gantry::Network::NicTeamingPolicy inForce = vswitch->GetTeamingPolicy();
-        SetFailoverFields(*result, inForce, vswitch->GetUplinks());
-        output->SetResult(result);
-        output->Finish();
-    } catch (GantryException& e) {
-        output->SetError(e.GetMessage(0));
-    }
+    boost::shared_ptr<MetaStruct> result = GetOutputStructure();
+    RunOnLegacySwitch(vswitchInfo, *input, *output, kVswitchName, [&](Gantry::Network::VirtualSwitch& vswitch) {
+        Gantry::Network::NicTeamingPolicy inForce = vswitch.GetTeamingPolicy();
+        SetFailoverFields(*result, inForce, vswitch.GetUplinks());
+        return result;
+    });
 }
 
 }  // namespace NetworkNamespace

@@ -35,21 +35,15 @@ boost::shared_ptr<OutputSpec> VirtualSwitchStandardPolicyFailoverSet::GetOutputS
 void VirtualSwitchStandardPolicyFailoverSet::ExecuteInternal(boost::shared_ptr<Input> input,
                                                              boost::shared_ptr<Output> output) {
     Trellis::Network::VirtualSwitchInfoImpl vswitchInfo;
-    try {
-        std::string name = input->GetString(kVswitchName);
-        std::unique_ptr<Gantry::Network::VirtualSwitch> vswitch = FindLegacyVirtualSwitch(vswitchInfo, name, *output);
-        if (!vswitch) return;
-        Gantry::Network::NicTeamingPolicy reference = vswitch->GetTeamingPolicy();
-        Gantry::Network::NicTeamingPolicy local = vswitch->GetLocalTeamingPolicy();
-        std::vector<std::string> connected = vswitch->GetUplinks();
+    RunOnLegacySwitch(vswitchInfo, *input, *output, kVswitchName, [&](Gantry::Network::VirtualSwitch& vswitch) {
+        Gantry::Network::NicTeamingPolicy reference = vswitch.GetTeamingPolicy();
+        Gantry::Network::NicTeamingPolicy local = vswitch.GetLocalTeamingPolicy();
+        std::vector<std::string> connected = vswitch.GetUplinks();
         SetFailoverPolicy(input, output, local, reference, connected);
-        if (!output->HasError()) vswitch->ApplyTeamingPolicy(local);
+        if (!output->HasError()) vswitch.ApplyTeamingPolicy(local);
         // A refused value leaves its text beside the true result.
-        output->SetResult(MetaBool::New(true));
-        output->Finish();
-    } catch (GantryException& e) {
-        output->SetError(e.GetMessage(0));
-    }
+        return MetaBool::New(true);
+    });
 }
 
 }  // namespace NetworkNamespace

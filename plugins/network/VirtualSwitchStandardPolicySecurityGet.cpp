@@ -33,27 +33,19 @@ boost::shared_ptr<OutputSpec> VirtualSwitchStandardPolicySecurityGet::GetOutputS
 
 boost::shared_ptr<MetaStruct> VirtualSwitchStandardPolicySecurityGet::GetOutputStructure() {
     boost::shared_ptr<MetaStruct> result = MetaStruct::New("VirtualSwitchSecurityPolicy");
-    result->SetField("Allow Promiscuous", MetaBool::New());
-    result->SetField("Allow MAC Address Change", MetaBool::New());
-    result->SetField("Allow Forged Transmits", MetaBool::New());
+    DeclareSecurityFields(*result);
     return result;
 }
 
 void VirtualSwitchStandardPolicySecurityGet::ExecuteInternal(boost::shared_ptr<Input> input,
                                                              boost::shared_ptr<Output> output) {
     Trellis::Network::VirtualSwitchInfoImpl vswitchInfo;
-    try {
-        std::string name = input->GetString(kVswitchName);
-        // The structure is named here and takes its fields as they are set.
-        boost::shared_ptr<MetaStruct> result = MetaStruct::New("VirtualSwitchSecurityPolicy");
-        std::unique_ptr<Gantry::Network::VirtualSwitch> vswitch = FindLegacyVirtualSwitch(vswitchInfo, name, *output);
-        if (!vswitch) return;
-        SetSecurityFields(*result, vswitch->GetSecurityPolicy());
-        output->SetResult(result);
-        output->Finish();
-    } catch (GantryException& e) {
-        output->SetError(e.GetMessage(0));
-    }
+    // The structure is named here and takes its fields as they are set.
+    boost::shared_ptr<MetaStruct> result = MetaStruct::New("VirtualSwitchSecurityPolicy");
+    RunOnLegacySwitch(vswitchInfo, *input, *output, kVswitchName, [&](Gantry::Network::VirtualSwitch& vswitch) {
+        SetSecurityFields(*result, vswitch.GetSecurityPolicy());
+        return result;
+    });
 }
 
 }  // namespace NetworkNamespace

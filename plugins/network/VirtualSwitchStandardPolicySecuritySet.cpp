@@ -36,23 +36,17 @@ boost::shared_ptr<OutputSpec> VirtualSwitchStandardPolicySecuritySet::GetOutputS
 void VirtualSwitchStandardPolicySecuritySet::ExecuteInternal(boost::shared_ptr<Input> input,
                                                              boost::shared_ptr<Output> output) {
     Trellis::Network::VirtualSwitchInfoImpl vswitchInfo;
-    try {
-        std::string name = input->GetString(kVswitchName);
-        std::unique_ptr<Gantry::Network::VirtualSwitch> vswitch = FindLegacyVirtualSwitch(vswitchInfo, name, *output);
-        if (!vswitch) return;
+    RunOnLegacySwitch(vswitchInfo, *input, *output, kVswitchName, [&](Gantry::Network::VirtualSwitch& vswitch) {
         // The policy in force is the base: storing it sets every field at this level.
-        Gantry::Network::PortSecurityPolicy policy = vswitch->GetSecurityPolicy();
+        Gantry::Network::PortSecurityPolicy policy = vswitch.GetSecurityPolicy();
         if (input->HasParameter(kAllowPromiscuous)) policy.SetAllowPromiscuous(input->GetBool(kAllowPromiscuous));
         if (input->HasParameter(kAllowMacChange)) policy.SetAllowMacAddressChange(input->GetBool(kAllowMacChange));
         if (input->HasParameter(kAllowForgedTransmits)) {
             policy.SetAllowForgedTransmits(input->GetBool(kAllowForgedTransmits));
         }
-        vswitch->ApplySecurityPolicy(policy);
-        output->SetResult(MetaBool::New(true));
-        output->Finish();
-    } catch (GantryException& e) {
-        output->SetError(e.GetMessage(0));
-    }
+        vswitch.ApplySecurityPolicy(policy);
+        return MetaBool::New(true);
+    });
 }
 
 }  // namespace NetworkNamespace

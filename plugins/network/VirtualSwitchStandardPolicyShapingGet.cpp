@@ -36,27 +36,18 @@ boost::shared_ptr<OutputSpec> VirtualSwitchStandardPolicyShapingGet::GetOutputSp
 
 boost::shared_ptr<MetaStruct> VirtualSwitchStandardPolicyShapingGet::GetOutputStructure() {
     boost::shared_ptr<MetaStruct> result = MetaStruct::New("VirtualSwitchTrafficShapingPolicy");
-    result->SetField("Enabled", MetaBool::New());
-    result->SetField("Average Bandwidth", MetaInt::New());
-    result->SetField("Peak Bandwidth", MetaInt::New());
-    result->SetField("Burst Size", MetaInt::New());
+    DeclareShapingFields(*result);
     return result;
 }
 
 void VirtualSwitchStandardPolicyShapingGet::ExecuteInternal(boost::shared_ptr<Input> input,
                                                             boost::shared_ptr<Output> output) {
     Trellis::Network::VirtualSwitchInfoImpl vswitchInfo;
-    try {
-        std::string name = input->GetString(kVswitchName);
-        boost::shared_ptr<MetaStruct> result = GetOutputStructure();
-        std::unique_ptr<Gantry::Network::VirtualSwitch> vswitch = FindLegacyVirtualSwitch(vswitchInfo, name, *output);
-        if (!vswitch) return;
-        SetShapingFields(*result, vswitch->GetShapingPolicy());
-        output->SetResult(result);
-        output->Finish();
-    } catch (GantryException& e) {
-        output->SetError(e.GetMessage(0));
-    }
+    boost::shared_ptr<MetaStruct> result = GetOutputStructure();
+    RunOnLegacySwitch(vswitchInfo, *input, *output, kVswitchName, [&](Gantry::Network::VirtualSwitch& vswitch) {
+        SetShapingFields(*result, vswitch.GetShapingPolicy());
+        return result;
+    });
 }
 
 }  // namespace NetworkNamespace

@@ -33,19 +33,13 @@ boost::shared_ptr<OutputSpec> VirtualSwitchStandardPolicyShapingSet::GetOutputSp
 void VirtualSwitchStandardPolicyShapingSet::ExecuteInternal(boost::shared_ptr<Input> input,
                                                             boost::shared_ptr<Output> output) {
     Trellis::Network::VirtualSwitchInfoImpl vswitchInfo;
-    try {
-        std::string name = input->GetString(kVswitchName);
-        std::unique_ptr<Gantry::Network::VirtualSwitch> vswitch = FindLegacyVirtualSwitch(vswitchInfo, name, *output);
-        if (!vswitch) return;
+    RunOnLegacySwitch(vswitchInfo, *input, *output, kVswitchName, [&](Gantry::Network::VirtualSwitch& vswitch) {
         // The policy in force is the base: storing it sets every field at this level.
-        Gantry::Network::ShapingPolicy policy = vswitch->GetShapingPolicy();
+        Gantry::Network::ShapingPolicy policy = vswitch.GetShapingPolicy();
         SetShapingPolicy(input, output, policy, false);
-        if (!output->HasError()) vswitch->ApplyShapingPolicy(policy);
-        output->SetResult(MetaBool::New(true));
-        output->Finish();
-    } catch (GantryException& e) {
-        output->SetError(e.GetMessage(0));
-    }
+        if (!output->HasError()) vswitch.ApplyShapingPolicy(policy);
+        return MetaBool::New(true);
+    });
 }
 
 }  // namespace NetworkNamespace
