@@ -5,7 +5,10 @@
 namespace Gantry {
 namespace Network {
 
+class DVPort;
+class DVSwitch;
 class PortGroup;
+struct DVPortParam;
 class VirtualSwitch;
 
 // Lookups of host objects across the host. What they return belongs to the
@@ -17,6 +20,12 @@ public:
     // The standard switch of that name; throws GantryException when there is
     // none.
     static VirtualSwitch* GetVirtualSwitchById(std::string const& name);
+    // The distributed switch of that name, or null when no distributed switch
+    // has it.
+    static DVSwitch* GetDVSwitchByName(std::string const& name);
+    // The port at these coordinates; throws GantryException when the switch
+    // has no such port.
+    static DVPort* GetDVPort(DVPortParam const& param);
 };
 
 }  // namespace Network

@@ -22,6 +22,8 @@ public:
     // The host's word for a standard switch (GetClass).
     static constexpr const char* CLASS_NAME = "etherswitch";
 
+    // A handle on a name (see PortsetImpl).
+    VirtualSwitchImpl(std::string const& name, int numPorts);
     explicit VirtualSwitchImpl(Trellis::Host::StandardSwitchRecord snapshot);
     ~VirtualSwitchImpl() override;
 
@@ -48,6 +50,9 @@ public:
     Gantry::Network::NicTeamingPolicy GetTeamingPolicy() override;
     Gantry::Network::NicTeamingPolicy GetLocalTeamingPolicy() override;
     void ApplyTeamingPolicy(Gantry::Network::NicTeamingPolicy const& policy) override;
+
+protected:
+    void Load(Trellis::Host::Transaction const& t) override;
 
 private:
     // Re-reads the stored record, lets change edit it, writes it back and

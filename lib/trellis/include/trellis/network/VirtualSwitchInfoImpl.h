@@ -3,6 +3,7 @@
 #include <string>
 #include <vector>
 
+#include "gantry/network/DVSwitch.h"
 #include "gantry/network/NicCapabilities.h"
 #include "gantry/network/NicTeamingPolicy.h"
 #include "gantry/network/PortSecurityPolicy.h"
@@ -12,7 +13,7 @@
 namespace Trellis {
 namespace Network {
 
-// The directory of the host's standard switches. A stack object; what it
+// The directory of the host's switches, standard and distributed. A stack object; what it
 // returns belongs to the caller. Its constructor is a host operation
 // ("VirtualSwitchInfoImpl::VirtualSwitchInfoImpl"), so an armed fault makes it throw.
 class VirtualSwitchInfoImpl {
@@ -36,6 +37,14 @@ public:
     // Deletes the switch with its port groups and frees its uplinks. Refuses
     // an unknown switch and one whose port groups have active clients.
     void RemoveVirtualSwitch(std::string const& name);
+
+    // Every distributed switch, in the order they were created.
+    std::vector<Gantry::Network::DVSwitch*> GetDVSwitches();
+    // Every switch: the standard ones, then the distributed ones.
+    std::vector<Gantry::Network::Portset*> GetAllSwitches();
+    // Whether the named switch is a standard one (false for a distributed
+    // switch and for a name that no switch has).
+    bool IsLegacySwitch(std::string const& name);
 };
 
 }  // namespace Network

@@ -1,0 +1,46 @@
+#pragma once
+
+#include <optional>
+#include <string>
+#include <vector>
+
+#include "gantry/network/DVPort.h"
+#include "trellis/host/records/DVSwitchRecords.h"
+
+namespace Trellis {
+namespace Network {
+
+// A port of a distributed switch. Made by a lookup, it answers from the
+// snapshot of its record and of the clients on it; made as a handle on a
+// switch's identity and a port id, it does no host I/O until asked, and then
+// reads its record inside the asking operation (a handle on a port that does
+// not exist fails there with the host's text).
+class DVPortImpl : public virtual Gantry::Network::DVPort {
+public:
+    DVPortImpl(std::string const& dvsId, std::string const& portId);
+    DVPortImpl(Trellis::Host::DVPortRecord snapshot, std::vector<std::string> clients);
+    ~DVPortImpl() override;
+
+    std::string GetPortId() override;
+    bool IsInUse(std::vector<std::string>& clients) override;
+    std::string GetPortGroupId() override;
+    std::string GetUplinkName() override;
+    Gantry::Network::LacpPortConfig GetLacpConfig() override;
+    // The same identity as GetPortGroupId, by the name the port walk uses.
+    std::string GetDVPortgroupId();
+
+private:
+    struct Loaded {
+        Trellis::Host::DVPortRecord record;
+        std::vector<std::string> clients;
+    };
+    template <class Op>
+    Loaded const& Answer(Op const& operation);
+
+    std::string dvsId_;
+    std::string portId_;
+    std::optional<Loaded> loaded_;
+};
+
+}  // namespace Network
+}  // namespace Trellis
