@@ -112,7 +112,7 @@ check "init --scale makes a host N times the default's size; a bad scale changes
 sim init --scale 4
 expect_status 0
 cli network vswitch standard portgroup list
-expect_stdout_matches "Guest Network-3 +switch3 +1 +0"
+expect_stdout_matches "Guest Network-3 +switch3 +2 +0"
 sim export
 scaled=$OUT
 for args in "--scale 0" "--scale 1001" "--scale x" "--scale 2 --empty" "--from $WORK/pass.json --scale 2"; do

@@ -25,7 +25,7 @@ expect_stdout "switch0
    Name: switch0
    Class: etherswitch
    Num Ports: 128
-   Used Ports: 3
+   Used Ports: 4
    Configured Ports: 128
    MTU: 1500
    CDP Status: listen
@@ -39,7 +39,7 @@ cli network vswitch standard portgroup list
 expect_stdout "Name             Virtual Switch  Active Clients  VLAN ID
 ---------------  --------------  --------------  -------
 Host Management  switch0         1               0
-Guest Network    switch0         1               0"
+Guest Network    switch0         2               0"
 
 check "a switch added with and without --ports, an uplink and a port group with a VLAN"
 cli network vswitch standard add -v switch1
@@ -60,7 +60,7 @@ cli --formatter json network vswitch standard list -v switch2
 expect_stdout_contains '"Num Ports":384,"Used Ports":0'
 expect_stdout_contains '"Beacon Required By":[],"Uplinks":[],"Portgroups":[]'
 cli --formatter json network vswitch standard portgroup list
-expect_stdout '[{"Name":"Host Management","Virtual Switch":"switch0","Active Clients":1,"VLAN ID":0},{"Name":"Guest Network","Virtual Switch":"switch0","Active Clients":1,"VLAN ID":0},{"Name":"Storage","Virtual Switch":"switch1","Active Clients":0,"VLAN ID":20}]'
+expect_stdout '[{"Name":"Host Management","Virtual Switch":"switch0","Active Clients":1,"VLAN ID":0},{"Name":"Guest Network","Virtual Switch":"switch0","Active Clients":2,"VLAN ID":0},{"Name":"Storage","Virtual Switch":"switch1","Active Clients":0,"VLAN ID":20}]'
 
 check "MTU and CDP status are set, and set with no option changes nothing"
 cli network vswitch standard set -v switch1 -m 9000 -c both
@@ -92,7 +92,7 @@ expect_refusal "Unable to add port group Storage to virtual switch switch2: a po
   network vswitch standard portgroup add -p Storage -v switch2
 expect_refusal "Virtual switch nosuch does not exist" \
   network vswitch standard portgroup add -p Backup -v nosuch
-expect_refusal "Unable to remove port group Guest Network from virtual switch switch0: it has 1 active client" \
+expect_refusal "Unable to remove port group Guest Network from virtual switch switch0: it has 2 active clients" \
   network vswitch standard portgroup remove -p "Guest Network" -v switch0
 expect_refusal "Unable to remove port group Storage from virtual switch switch2: the switch has no port group of that name" \
   network vswitch standard portgroup remove -p Storage -v switch2

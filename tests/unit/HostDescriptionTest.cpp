@@ -123,7 +123,7 @@ TEST(HostDescription, ImportReplacesTheWholeHost) {
     Json empty = Json::parse(ExportHost());
     EXPECT_EQ(empty, Json::parse(R"({"format": 1, "modules": [],
         "firewall": {"enabled": false, "defaultAction": "PASS", "rulesetsLoaded": false, "rulesets": [], "dynamicRules": []},
-        "nics": [], "standardSwitches": [], "portGroups": [], "ports": [],
+        "nics": [], "standardSwitches": [], "portGroups": [], "distributedSwitches": [], "worlds": [], "ports": [],
         "faults": [], "exec": []})"));
     EXPECT_TRUE(ListFaults().empty());  // the faults were replaced too, and this process knows it
 }

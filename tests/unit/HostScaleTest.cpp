@@ -45,27 +45,41 @@ TEST(HostScale, EachCopyIsTheDefaultHostRenamedWithItsReferencesWithinIt) {
     for (const char* single : {"enabled", "defaultAction", "rulesetsLoaded", "dynamicRules"})
         EXPECT_EQ(scaled["firewall"][single], original["firewall"][single]) << single;
     EXPECT_EQ(scaled["firewall"]["rulesets"].size(), 3 * original["firewall"]["rulesets"].size());
-    EXPECT_EQ(scaled["nics"].size(), 9u);
+    EXPECT_EQ(scaled["nics"].size(), 18u);
     EXPECT_EQ(scaled["standardSwitches"].size(), 3u);
     EXPECT_EQ(scaled["portGroups"].size(), 6u);
-    EXPECT_EQ(scaled["ports"].size(), 6u);
+    EXPECT_EQ(scaled["distributedSwitches"].size(), 6u);
+    EXPECT_EQ(scaled["worlds"].size(), 6u);
+    EXPECT_EQ(scaled["ports"].size(), 24u);
 
     // Copy 2: numbered names move past the default's, the others take a suffix.
     Json ruleset = Named(original["firewall"]["rulesets"], "webAccess");
     ruleset["name"] = "webAccess-2";
     EXPECT_EQ(Named(scaled["firewall"]["rulesets"], "webAccess-2"), ruleset);
     Json nic = Named(original["nics"], "pnet1");
-    nic["name"] = "pnet7";
-    EXPECT_EQ(Named(scaled["nics"], "pnet7"), nic);
+    nic["name"] = "pnet13";
+    EXPECT_EQ(Named(scaled["nics"], "pnet13"), nic);
     const Json& vswitch = Named(scaled["standardSwitches"], "switch2");
-    EXPECT_EQ(vswitch["uplinks"], Json({"pnet6"}));
-    EXPECT_EQ(vswitch["policy"]["teaming"]["uplinkOrder"], Json({"pnet6"}));
+    EXPECT_EQ(vswitch["uplinks"], Json({"pnet12"}));
+    EXPECT_EQ(vswitch["policy"]["teaming"]["uplinkOrder"], Json({"pnet12"}));
     EXPECT_EQ(vswitch["numPorts"], 128);  // three times 128 is within the host's limit
     EXPECT_EQ(Named(scaled["portGroups"], "Guest Network-2")["vswitch"], "switch2");
-    EXPECT_EQ(scaled["ports"][4], Json::parse(R"({"id": 33554440, "portset": "switch2",
-        "portGroup": "Host Management-2", "clientKind": "tesselNic", "clientName": "tsl2"})"));
-    EXPECT_EQ(scaled["ports"][5], Json::parse(R"({"id": 33554441, "portset": "switch2",
-        "portGroup": "Guest Network-2", "clientKind": "vmAdapter", "clientName": "web03.eth0"})"));
+    const Json& interfacePort = scaled["ports"][17];
+    EXPECT_EQ(interfacePort["id"], 33554436 + 2 * 18);
+    EXPECT_EQ(interfacePort["portGroup"], "Host Management-2");
+    EXPECT_EQ(interfacePort["clientName"], "tsl2");
+    // A VM's adapter on a distributed switch: its switch, world, NIC and
+    // address are the copy's own.
+    const Json& adapterPort = scaled["ports"][23];
+    const Json& world = scaled["worlds"][4];
+    EXPECT_EQ(adapterPort["portset"], "dvSwitch4");
+    EXPECT_EQ(adapterPort["clientName"], world["name"].get<std::string>() + ".eth1");
+    EXPECT_EQ(adapterPort["worldId"], world["id"]);
+    EXPECT_EQ(adapterPort["teamUplink"], "pnet16");
+    EXPECT_EQ(adapterPort["macAddresses"], Json({"00:50:56:a1:02:03"}));
+    const Json& dvs = Named(scaled["distributedSwitches"], "dvSwitch4");
+    EXPECT_EQ(dvs["lacpGroups"][0]["nics"][0]["name"], "pnet16");
+    EXPECT_NE(dvs["id"], Named(scaled["distributedSwitches"], "dvSwitch0")["id"]);
 
     const std::string exported = ExportHost();
     ImportHost(exported);
@@ -91,7 +105,7 @@ TEST(HostScale, ASwitchThatUsesMoreThanItsShareKeepsWhatItUses) {
         d["portGroups"].push_back({{"name", "Crowd"}, {"vswitch", "busy"}, {"vlanId", 0}});
         for (int i = 0; i < 30; ++i)
             d["ports"].push_back({{"id", 100 + i}, {"portset", "busy"}, {"portGroup", "Crowd"},
-                                  {"clientKind", "vmAdapter"}, {"clientName", "vm" + std::to_string(i) + ".eth0"}});
+                                  {"clientKind", "tesselNic"}, {"clientName", "tsl" + std::to_string(10 + i)}});
     }));
     Json scaled = ScaledDescription(original, 5);
     ParseDescription(scaled);

@@ -159,7 +159,10 @@ TEST(HostStore, AStoreWithoutParentsGetsTheParentOfEveryPortGroupAndPort) {
         EXPECT_EQ(groups, (std::vector<std::string>{"Host Management-1", "Guest Network-1"}));
         for (const char* vswitch : {"switch0", "switch1", "switch2"}) {
             EXPECT_EQ(t.CountChildrenOf<PortGroupRecord>(vswitch), 2u) << vswitch;
-            EXPECT_EQ(t.CountChildrenOf<PortRecord>(vswitch), 2u) << vswitch;
+            EXPECT_EQ(t.CountChildrenOf<PortRecord>(vswitch), 4u) << vswitch;  // an uplink's and three clients'
+        }
+        for (const char* dvswitch : {"dvSwitch0", "dvSwitch2", "dvSwitch4"}) {
+            EXPECT_EQ(t.CountChildrenOf<PortRecord>(dvswitch), 4u) << dvswitch;  // three uplinks' and a VM's
         }
     });
 }

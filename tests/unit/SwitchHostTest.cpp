@@ -94,8 +94,8 @@ TEST(SwitchHost, GroupsAndPortsCountOnTheirOwnSwitchAsGroupsComeAndGo) {
         return dynamic_cast<Trellis::Network::PortGroupImpl&>(*GroupNamed(group)).GetActiveClients();
     };
     EXPECT_EQ(groupsOf("switch1"), Names({"Host Management-1", "Guest Network-1"}));
-    EXPECT_EQ(SwitchNamed("switch1")->GetUsedPorts(), 3);  // an uplink and two clients
-    EXPECT_EQ(activeClients("Guest Network-1"), 1);
+    EXPECT_EQ(SwitchNamed("switch1")->GetUsedPorts(), 4);  // an uplink and three clients
+    EXPECT_EQ(activeClients("Guest Network-1"), 2);
 
     delete SwitchNamed("switch1")->AddPortGroup("Extra");
     EXPECT_EQ(groupsOf("switch1"), Names({"Host Management-1", "Guest Network-1", "Extra"}));
@@ -262,10 +262,10 @@ TEST(SwitchHost, TheDescriptionRefusesSwitchingThatCannotBe) {
          "portGroups[0].vswitch: no standard switch \"nosuch\""},
         {[](Json& d) { d["portGroups"][0]["policy"]["teaming"]["loadBalancing"] = "portid"; },
          "portGroups[0].policy.teaming.loadBalancing: expected \"iphash\", \"srcmac\", \"srcport\" or \"explicit\""},
-        {[](Json& d) { d["ports"][0]["portGroup"] = "Storage"; },
-         "ports[0].portGroup: no port group \"Storage\" on \"switch0\""},
+        {[](Json& d) { d["ports"][1]["portGroup"] = "Storage"; },
+         "ports[1].portGroup: no port group \"Storage\" on \"switch0\""},
         {[](Json& d) { d["standardSwitches"][0]["numPorts"] = 2; },
-         "ports[1]: \"switch0\" has no free port left (2 ports)"},
+         "ports[2]: \"switch0\" has no free port left (2 ports)"},
     };
     for (const Case& c : cases) {
         std::string refusal;
@@ -296,7 +296,8 @@ TEST(SwitchHost, AnOlderHostGetsTheDefaultSwitchingAndKeepsTheRest) {
 
     host.Reopen();
     EXPECT_EQ(Switch("switch0")["mtu"], 1500);  // seeded from the default host
-    EXPECT_EQ(Section("nics").size(), 3u);
-    EXPECT_EQ(Section("ports").size(), 2u);
+    EXPECT_EQ(Section("nics").size(), 6u);
+    EXPECT_EQ(Section("ports").size(), 8u);
+    EXPECT_EQ(Section("distributedSwitches").size(), 2u);
     EXPECT_EQ(Section("firewall")["enabled"], false);
 }

@@ -2,9 +2,11 @@
 
 #include <string>
 
+#include "host/DistributedMigration.h"
 #include "host/Sqlite.h"
 #include "host/description/DescriptionIo.h"
 #include "trellis/host/Transaction.h"
+#include "trellis/host/records/DVSwitchRecords.h"
 #include "trellis/host/records/PortRecord.h"
 #include "trellis/host/records/SwitchRecords.h"
 
@@ -35,11 +37,14 @@ const std::vector<Migration>& Migrations() {
              SeedSection(t, "portGroups");
              SeedSection(t, "ports");
          }},
-        {4, "the parent of every port group and port, found through an index",
+        {4, "the parent of every port group, port and DVPort, found through an index",
          [](Transaction& t) {
              StoreParents<PortGroupRecord>(t);
              StoreParents<PortRecord>(t);
+             StoreParents<DVPortRecord>(t);
          }},
+        {5, "running VMs, distributed switches, and the VMs, addresses and counters of the ports in use",
+         [](Transaction& t) { MigrateToDistributedSwitches(t); }},
     };
     return steps;
 }

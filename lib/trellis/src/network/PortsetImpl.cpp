@@ -4,6 +4,7 @@
 
 #include "SwitchStore.h"
 #include "trellis/host/Operation.h"
+#include "trellis/network/PortImpl.h"
 
 namespace Trellis {
 namespace Network {
@@ -16,13 +17,35 @@ const Trellis::Host::Operation kGetUsedPorts("Portset::GetUsedPorts");
 const Trellis::Host::Operation kGetUplinks("Portset::GetUplinks");
 const Trellis::Host::Operation kGetClass("Portset::GetClass");
 const Trellis::Host::Operation kIsValidVirtualSwitch("PortsetImpl::IsValidVirtualSwitch");
+const Trellis::Host::Operation kGetPorts("PortsetImpl::GetPorts");
 }  // namespace
 
 PortsetImpl::PortsetImpl(std::string name, int numPorts, std::vector<std::string> uplinks, std::string className)
-    : name_(std::move(name)), numPorts_(numPorts), uplinks_(std::move(uplinks)), className_(std::move(className)) {}
+    : name_(std::move(name)),
+      numPorts_(numPorts),
+      uplinks_(std::move(uplinks)),
+      className_(std::move(className)),
+      loaded_(true) {}
+
+PortsetImpl::PortsetImpl(std::string name, int numPorts, std::string className)
+    : name_(std::move(name)), numPorts_(numPorts), className_(std::move(className)), loaded_(false) {}
+
+void PortsetImpl::Answer(Trellis::Host::Operation const& operation) {
+    if (loaded_)
+        operation.Check();
+    else
+        operation.Read([&](Trellis::Host::Transaction& t) { EnsureLoaded(t); });
+}
+
+void PortsetImpl::EnsureLoaded(Trellis::Host::Transaction const& t) {
+    if (loaded_) return;
+    Load(t);
+    loaded_ = true;
+}
 
 PortsetImpl::~PortsetImpl() {}
 
+// A handle knows its name without asking the host.
 std::string PortsetImpl::GetName() {
     kGetName.Check();
     return name_;
@@ -31,29 +54,40 @@ std::string PortsetImpl::GetName() {
 // The simulated host reserves no ports of its own: a switch has the ports it
 // was configured with.
 int PortsetImpl::GetNumPorts() {
-    kGetNumPorts.Check();
+    Answer(kGetNumPorts);
     return numPorts_;
 }
 
 int PortsetImpl::GetConfiguredPorts() {
-    kGetConfiguredPorts.Check();
+    Answer(kGetConfiguredPorts);
     return numPorts_;
 }
 
 int PortsetImpl::GetUsedPorts() {
     return kGetUsedPorts.Read([&](Trellis::Host::Transaction& t) {
+        EnsureLoaded(t);
         return static_cast<int>(SwitchStore::ClientPortsOf(t, name_)) + static_cast<int>(uplinks_.size());
     });
 }
 
 std::vector<std::string> PortsetImpl::GetUplinks() {
-    kGetUplinks.Check();
+    Answer(kGetUplinks);
     return uplinks_;
 }
 
 std::string PortsetImpl::GetClass() {
-    kGetClass.Check();
+    Answer(kGetClass);
     return className_;
+}
+
+std::vector<PortImpl*> PortsetImpl::GetPorts() {
+    std::vector<Trellis::Host::PortRecord> records = kGetPorts.Read([&](Trellis::Host::Transaction& t) {
+        EnsureLoaded(t);
+        return t.ChildrenOf<Trellis::Host::PortRecord>(name_);
+    });
+    std::vector<PortImpl*> ports;
+    for (Trellis::Host::PortRecord& record : records) ports.push_back(new PortImpl(std::move(record)));
+    return ports;
 }
 
 bool PortsetImpl::IsValidVirtualSwitch(std::string const& name) {

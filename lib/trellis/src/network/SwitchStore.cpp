@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <cstdint>
 
+#include "DVSwitchStore.h"
 #include "PolicyInheritance.h"
 #include "gantry/lib/GantryException.h"
 #include "host/StoredText.h"
@@ -40,7 +41,8 @@ std::vector<PortGroupRecord> PortGroupsOf(Transaction const& t, std::string cons
 }
 
 std::int64_t ClientPortsOf(Transaction const& t, std::string const& vswitch) {
-    return static_cast<std::int64_t>(t.CountChildrenOf<PortRecord>(vswitch));
+    return static_cast<std::int64_t>(t.CountChildrenOf<PortRecord>(vswitch)) -
+           static_cast<std::int64_t>(t.CountChildrenWith<PortRecord>(vswitch, "clientKind", "uplink"));
 }
 
 std::int64_t ActiveClientsOf(Transaction const& t, PortGroupRecord const& group) {
@@ -60,8 +62,33 @@ int ConfiguredPortsOnHost(Transaction const& t) {
 std::optional<std::string> SwitchOfUplink(Transaction const& t, std::string const& nic) {
     for (StandardSwitchRecord const& vswitch : t.List<StandardSwitchRecord>())
         if (std::find(vswitch.uplinks.begin(), vswitch.uplinks.end(), nic) != vswitch.uplinks.end())
-            return vswitch.name;
+            return "virtual switch " + vswitch.name;
+    std::string distributed = DVSwitchStore::SwitchOfNic(t, nic);
+    if (!distributed.empty()) return "distributed switch " + distributed;
     return std::nullopt;
+}
+
+std::int64_t NewPortId(Transaction const& t) {
+    std::int64_t highest = kFirstPortId - 1;
+    for (std::string const& name : t.Names<PortRecord>()) highest = std::max<std::int64_t>(highest, std::stoll(name));
+    if (highest >= INT32_MAX) Refuse("Unable to connect a port: the host has no port id left");
+    return highest + 1;
+}
+
+void AddUplinkPort(Transaction& t, std::string const& vswitch, std::string const& nic) {
+    PortRecord port;
+    port.id = NewPortId(t);
+    port.name = std::to_string(port.id);
+    port.portset = vswitch;
+    port.clientKind = Trellis::Host::PortClientKind::Uplink;
+    port.clientName = nic;
+    t.Put(port);
+}
+
+void RemoveUplinkPorts(Transaction& t, std::string const& vswitch, std::optional<std::string> const& nic) {
+    for (PortRecord const& port : t.ChildrenOf<PortRecord>(vswitch))
+        if (port.clientKind == Trellis::Host::PortClientKind::Uplink && (!nic || port.clientName == *nic))
+            t.Erase<PortRecord>(port.name);
 }
 
 Trellis::Host::StoredPolicies PortGroupPolicies(Transaction const& t, PortGroupRecord const& group) {

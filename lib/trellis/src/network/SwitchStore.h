@@ -28,15 +28,26 @@ Trellis::Host::PortGroupRecord RequirePortGroup(Trellis::Host::Transaction const
 // The port groups of a switch, in the host's order.
 std::vector<Trellis::Host::PortGroupRecord> PortGroupsOf(Trellis::Host::Transaction const& t,
                                                          std::string const& vswitch);
-// The client ports on a switch, or in one port group.
+// The client ports on a switch (not its uplinks' ports), or in one port group.
 std::int64_t ClientPortsOf(Trellis::Host::Transaction const& t, std::string const& vswitch);
 std::int64_t ActiveClientsOf(Trellis::Host::Transaction const& t, Trellis::Host::PortGroupRecord const& group);
 // Client ports and uplinks.
 int UsedPortsOf(Trellis::Host::Transaction const& t, Trellis::Host::StandardSwitchRecord const& vswitch);
 // The configured ports of all switches of the host.
 int ConfiguredPortsOnHost(Trellis::Host::Transaction const& t);
-// The switch that has the NIC as an uplink, if any.
+// The switch, standard or distributed, that has the NIC as an uplink, if
+// any, named with its kind: "virtual switch switch0".
 std::optional<std::string> SwitchOfUplink(Trellis::Host::Transaction const& t, std::string const& nic);
+
+// The ports the host hands out are numbered from here up, past the highest
+// in use.
+inline constexpr std::int64_t kFirstPortId = 33554432;
+std::int64_t NewPortId(Trellis::Host::Transaction const& t);
+// Gives a switch's new uplink a port of its own; takes the ports of one
+// uplink (or of all, without nic) away.
+void AddUplinkPort(Trellis::Host::Transaction& t, std::string const& vswitch, std::string const& nic);
+void RemoveUplinkPorts(Trellis::Host::Transaction& t, std::string const& vswitch,
+                       std::optional<std::string> const& nic);
 
 // The policies in force on a port group, read with its switch's.
 Trellis::Host::StoredPolicies PortGroupPolicies(Trellis::Host::Transaction const& t,

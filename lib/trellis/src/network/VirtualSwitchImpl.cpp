@@ -51,7 +51,13 @@ bool Contains(std::vector<std::string> const& names, std::string const& name) {
 VirtualSwitchImpl::VirtualSwitchImpl(StandardSwitchRecord snapshot)
     : PortsetImpl(snapshot.name, snapshot.numPorts, snapshot.uplinks, CLASS_NAME), snapshot_(std::move(snapshot)) {}
 
+VirtualSwitchImpl::VirtualSwitchImpl(std::string const& name, int numPorts) : PortsetImpl(name, numPorts, CLASS_NAME) {
+    snapshot_.name = name;
+}
+
 VirtualSwitchImpl::~VirtualSwitchImpl() {}
+
+void VirtualSwitchImpl::Load(Transaction const& t) { Refresh(SwitchStore::RequireSwitch(t, name_)); }
 
 template <class Change>
 void VirtualSwitchImpl::Update(Operation const& operation, Change&& change) {
@@ -79,22 +85,23 @@ std::vector<Gantry::Network::PortGroup*> VirtualSwitchImpl::GetPortGroups() {
 }
 
 int VirtualSwitchImpl::GetBeaconInterval() {
-    kGetBeaconInterval.Check();
+    Answer(kGetBeaconInterval);
     return snapshot_.beaconInterval;
 }
 
 bool VirtualSwitchImpl::GetBeaconEnabled() {
-    kGetBeaconEnabled.Check();
+    Answer(kGetBeaconEnabled);
     return snapshot_.beaconEnabled;
 }
 
 int VirtualSwitchImpl::GetBeaconThreshold() {
-    kGetBeaconThreshold.Check();
+    Answer(kGetBeaconThreshold);
     return snapshot_.beaconThreshold;
 }
 
 std::vector<std::string> VirtualSwitchImpl::GetBeaconRequiredBy() {
     return kGetBeaconRequiredBy.Read([&](Transaction& t) {
+        EnsureLoaded(t);
         Trellis::Host::StoredPolicies switchInForce = SwitchPoliciesInForce(snapshot_);
         std::vector<std::string> names;
         if (switchInForce.teaming.linkCriteria.IsBeaconDetection()) names.push_back(name_);
@@ -115,12 +122,12 @@ void VirtualSwitchImpl::SetCdpStatus(Gantry::Network::CdpStatus status) {
 }
 
 std::string VirtualSwitchImpl::GetCdpStatus() {
-    kGetCdpStatus.Check();
+    Answer(kGetCdpStatus);
     return Trellis::Host::WordOf(snapshot_.cdpStatus, Trellis::Host::kCdpStatusWords);
 }
 
 int VirtualSwitchImpl::GetMtu() {
-    kGetMtu.Check();
+    Answer(kGetMtu);
     return snapshot_.mtu;
 }
 
@@ -142,20 +149,22 @@ void VirtualSwitchImpl::AddUplink(std::string const& nicName) {
             SwitchStore::Refuse(refusal + "there is no physical NIC of that name");
         if (Contains(record.uplinks, nicName)) SwitchStore::Refuse(refusal + "it is already an uplink of this switch");
         if (std::optional<std::string> other = SwitchStore::SwitchOfUplink(t, nicName))
-            SwitchStore::Refuse(refusal + "it is already an uplink of virtual switch " + *other);
+            SwitchStore::Refuse(refusal + "it is already an uplink of " + *other);
         if (SwitchStore::UsedPortsOf(t, record) >= record.numPorts)
             SwitchStore::Refuse(refusal + "all " + std::to_string(record.numPorts) + " ports of the switch are in use");
         record.uplinks.push_back(nicName);
+        SwitchStore::AddUplinkPort(t, name_, nicName);
     });
 }
 
 void VirtualSwitchImpl::RemoveUplink(std::string const& nicName) {
-    Update(kRemoveUplink, [&](Transaction&, StandardSwitchRecord& record) {
+    Update(kRemoveUplink, [&](Transaction& t, StandardSwitchRecord& record) {
         auto position = std::find(record.uplinks.begin(), record.uplinks.end(), nicName);
         if (position == record.uplinks.end())
             SwitchStore::Refuse("Unable to remove uplink " + nicName + " from virtual switch " + name_ +
                                 ": it is not an uplink of this switch");
         record.uplinks.erase(position);
+        SwitchStore::RemoveUplinkPorts(t, name_, nicName);
     });
 }
 
@@ -193,7 +202,7 @@ void VirtualSwitchImpl::RemovePortGroup(std::string const& portGroupName) {
 }
 
 Gantry::Network::PortSecurityPolicy VirtualSwitchImpl::GetSecurityPolicy() {
-    kGetSecurityPolicy.Check();
+    Answer(kGetSecurityPolicy);
     return SwitchPoliciesInForce(snapshot_).security;
 }
 
@@ -202,7 +211,7 @@ void VirtualSwitchImpl::ApplySecurityPolicy(Gantry::Network::PortSecurityPolicy 
 }
 
 Gantry::Network::ShapingPolicy VirtualSwitchImpl::GetShapingPolicy() {
-    kGetShapingPolicy.Check();
+    Answer(kGetShapingPolicy);
     return SwitchPoliciesInForce(snapshot_).shaping;
 }
 
@@ -213,12 +222,12 @@ void VirtualSwitchImpl::ApplyShapingPolicy(Gantry::Network::ShapingPolicy const&
 }
 
 Gantry::Network::NicTeamingPolicy VirtualSwitchImpl::GetTeamingPolicy() {
-    kGetTeamingPolicy.Check();
+    Answer(kGetTeamingPolicy);
     return SwitchPoliciesInForce(snapshot_).teaming;
 }
 
 Gantry::Network::NicTeamingPolicy VirtualSwitchImpl::GetLocalTeamingPolicy() {
-    kGetLocalTeamingPolicy.Check();
+    Answer(kGetLocalTeamingPolicy);
     return AsLocal(SwitchPoliciesInForce(snapshot_).teaming, snapshot_.policies.teaming);
 }
 

@@ -3,9 +3,11 @@
 #include <optional>
 #include <utility>
 
+#include "DVSwitchStore.h"
 #include "SwitchStore.h"
 #include "host/StoredText.h"
 #include "trellis/host/Operation.h"
+#include "trellis/network/DVSwitchImpl.h"
 #include "trellis/network/VirtualSwitchImpl.h"
 
 namespace Trellis {
@@ -24,6 +26,18 @@ const Operation kAddVirtualSwitchWithPolicy("VirtualSwitchInfoImpl::AddVirtualSw
 const Operation kGetVirtualSwitches("VirtualSwitchInfoImpl::GetVirtualSwitches");
 const Operation kGetVirtualSwitchByName("VirtualSwitchInfoImpl::GetVirtualSwitchByName");
 const Operation kRemoveVirtualSwitch("VirtualSwitchInfoImpl::RemoveVirtualSwitch");
+const Operation kGetDVSwitches("VirtualSwitchInfoImpl::GetDVSwitches");
+const Operation kGetAllSwitches("VirtualSwitchInfoImpl::GetAllSwitches");
+const Operation kIsLegacySwitch("VirtualSwitchInfoImpl::IsLegacySwitch");
+
+std::vector<Gantry::Network::DVSwitch*> DVSwitchesOf(Transaction const& t) {
+    std::vector<Gantry::Network::DVSwitch*> switches;
+    for (Trellis::Host::DVSwitchRecord& record : t.List<Trellis::Host::DVSwitchRecord>()) {
+        std::vector<std::string> uplinks = DVSwitchStore::UplinksOf(t, record.name);
+        switches.push_back(new DVSwitchImpl(std::move(record), std::move(uplinks)));
+    }
+    return switches;
+}
 
 }  // namespace
 
@@ -43,6 +57,8 @@ Gantry::Network::VirtualSwitch* VirtualSwitchInfoImpl::AddVirtualSwitchWithPolic
         SwitchStore::RequireStorableName(name, refusal);
         if (t.Contains<StandardSwitchRecord>(name))
             SwitchStore::Refuse(refusal + "a virtual switch of that name already exists");
+        if (t.Contains<Trellis::Host::DVSwitchRecord>(name))
+            SwitchStore::Refuse(refusal + "a distributed switch of that name already exists");
         if (numPorts < SwitchLimits::kMinPorts || numPorts > SwitchLimits::kMaxPortsPerSwitch)
             SwitchStore::Refuse(refusal + std::to_string(numPorts) + " is not a valid number of ports (" +
                                 std::to_string(SwitchLimits::kMinPorts) + " to " +
@@ -88,9 +104,34 @@ void VirtualSwitchInfoImpl::RemoveVirtualSwitch(std::string const& name) {
                                     " has active clients");
         if (SwitchStore::ClientPortsOf(t, name) > 0)
             SwitchStore::Refuse("Unable to remove virtual switch " + name + ": it has ports in use");
+        SwitchStore::RemoveUplinkPorts(t, name, std::nullopt);
         for (PortGroupRecord const& group : groups) t.Erase<PortGroupRecord>(group.name);
         t.Erase<StandardSwitchRecord>(name);
     });
+}
+
+}  // namespace Network
+}  // namespace Trellis
+
+namespace Trellis {
+namespace Network {
+
+std::vector<Gantry::Network::DVSwitch*> VirtualSwitchInfoImpl::GetDVSwitches() {
+    return kGetDVSwitches.Read([](Transaction& t) { return DVSwitchesOf(t); });
+}
+
+std::vector<Gantry::Network::Portset*> VirtualSwitchInfoImpl::GetAllSwitches() {
+    return kGetAllSwitches.Read([](Transaction& t) {
+        std::vector<Gantry::Network::Portset*> switches;
+        for (StandardSwitchRecord& record : t.List<StandardSwitchRecord>())
+            switches.push_back(new VirtualSwitchImpl(std::move(record)));
+        for (Gantry::Network::DVSwitch* dvs : DVSwitchesOf(t)) switches.push_back(dvs);
+        return switches;
+    });
+}
+
+bool VirtualSwitchInfoImpl::IsLegacySwitch(std::string const& name) {
+    return kIsLegacySwitch.Read([&](Transaction& t) { return t.Contains<StandardSwitchRecord>(name); });
 }
 
 }  // namespace Network

@@ -8,6 +8,10 @@
 #include "trellis/host/records/DVSwitchRecords.h"
 
 namespace Trellis {
+namespace Host {
+class Operation;
+}  // namespace Host
+
 namespace Network {
 
 // A port of a distributed switch. Made by a lookup, it answers from the
@@ -30,16 +34,13 @@ public:
     std::string GetDVPortgroupId();
 
 private:
-    struct Loaded {
-        Trellis::Host::DVPortRecord record;
-        std::vector<std::string> clients;
-    };
-    template <class Op>
-    Loaded const& Answer(Op const& operation);
+    // The port's record, read inside operation on a handle.
+    Trellis::Host::DVPortRecord const& Record(Trellis::Host::Operation const& operation);
 
     std::string dvsId_;
     std::string portId_;
-    std::optional<Loaded> loaded_;
+    std::optional<Trellis::Host::DVPortRecord> record_;
+    std::optional<std::vector<std::string>> clients_;
 };
 
 }  // namespace Network

@@ -22,7 +22,8 @@ public:
     static constexpr const char* CLASS_NAME = "dvswitch";
 
     DVSwitchImpl(std::string const& name, int numPorts);
-    explicit DVSwitchImpl(Trellis::Host::DVSwitchRecord snapshot);
+    // uplinks: the NICs of its uplink ports, in port order.
+    DVSwitchImpl(Trellis::Host::DVSwitchRecord snapshot, std::vector<std::string> uplinks);
     ~DVSwitchImpl() override;
 
     std::string GetId() override;
@@ -46,7 +47,7 @@ protected:
     void Load(Trellis::Host::Transaction const& t) override;
 
 private:
-    void Refresh(Trellis::Host::DVSwitchRecord record);
+    void Refresh(Trellis::Host::DVSwitchRecord record, std::vector<std::string> uplinks);
 
     Trellis::Host::DVSwitchRecord snapshot_;
 };

@@ -3,6 +3,7 @@
 // has more ports in use (clients and uplinks) than it has ports.
 
 #include <algorithm>
+#include <cstdio>
 #include <map>
 #include <set>
 #include <string>
@@ -11,6 +12,7 @@
 
 #include "host/description/SwitchingSections.h"
 #include "trellis/host/Transaction.h"
+#include "trellis/host/records/PnicRecord.h"
 
 namespace Trellis {
 namespace Host {
@@ -27,21 +29,59 @@ void PortsSection::Parse(const JsonReader& value) {
 
 void PortsSection::CheckReferences(const ParsedDescription& description) const {
     const auto& switches = description.Get<StandardSwitchesSection>();
+    const auto& distributed = description.Get<DistributedSwitchesSection>();
     const auto& groups = description.Get<PortGroupsSection>();
+    const auto& worlds = description.Get<WorldsSection>();
     std::map<std::string, int> used;
+    std::set<std::string> uplinkPorts;  // switch and NIC of every uplink's port
+    std::set<std::string> busyDvPorts;
     for (std::size_t i = 0; i < ports_.size(); ++i) {
         const PortRecord& port = ports_[i];
-        const StandardSwitchRecord* vswitch = switches.Find(port.portset);
-        if (vswitch == nullptr)
-            throw DescriptionError(paths_[i] + ".portset: no standard switch \"" + port.portset + "\"");
-        const PortGroupRecord* group = groups.Find(port.portGroup);
-        if (group == nullptr || group->vswitch != port.portset)
-            throw DescriptionError(paths_[i] + ".portGroup: no port group \"" + port.portGroup + "\" on \"" +
-                                   port.portset + "\"");
-        auto count = used.emplace(port.portset, static_cast<int>(vswitch->uplinks.size())).first;
-        if (++count->second > vswitch->numPorts)
-            throw DescriptionError(paths_[i] + ": \"" + port.portset + "\" has no free port left (" +
-                                   std::to_string(vswitch->numPorts) + " ports)");
+        const std::string& at = paths_[i];
+        auto fail = [&](const std::string& field, const std::string& problem) {
+            throw DescriptionError(at + (field.empty() ? "" : "." + field) + ": " + problem);
+        };
+        int numPorts = 0;
+        std::vector<std::string> uplinks;
+        if (const StandardSwitchRecord* vswitch = switches.Find(port.portset)) {
+            numPorts = vswitch->numPorts;
+            uplinks = vswitch->uplinks;
+            if (!port.dvPort.empty()) fail("dvPort", "\"" + port.portset + "\" is a standard switch");
+            const PortGroupRecord* group = groups.Find(port.portGroup);
+            if (port.clientKind != PortClientKind::Uplink && (group == nullptr || group->vswitch != port.portset))
+                fail("portGroup", "no port group \"" + port.portGroup + "\" on \"" + port.portset + "\"");
+            if (port.clientKind == PortClientKind::Uplink &&
+                std::find(uplinks.begin(), uplinks.end(), port.clientName) == uplinks.end())
+                fail("clientName", "\"" + port.clientName + "\" is no uplink of \"" + port.portset + "\"");
+        } else if (const DVSwitchRecord* dvs = distributed.Find(port.portset)) {
+            numPorts = dvs->numPorts;
+            if (port.dvPort.empty()) fail("dvPort", "expected the DVPort on \"" + port.portset + "\"");
+            const DVPortRecord* dvPort = distributed.FindPort(port.portset, port.dvPort);
+            if (dvPort == nullptr) fail("dvPort", "no DVPort " + port.dvPort + " on \"" + port.portset + "\"");
+            if (port.clientKind == PortClientKind::Uplink && dvPort->nic != port.clientName)
+                fail("clientName", "DVPort " + port.dvPort + " has no NIC \"" + port.clientName + "\"");
+            if (port.clientKind != PortClientKind::Uplink && dvPort->IsUplink())
+                fail("dvPort", "DVPort " + port.dvPort + " is an uplink port");
+            if (!busyDvPorts.insert(port.portset + "/" + port.dvPort).second)
+                fail("dvPort", "DVPort " + port.dvPort + " is already in use");
+            uplinks.clear();  // the distributed switch's uplinks have DVPorts of their own
+        } else {
+            fail("portset", "no switch \"" + port.portset + "\"");
+        }
+        if (port.clientKind == PortClientKind::Uplink) {
+            if (!uplinkPorts.insert(port.portset + "/" + port.clientName).second)
+                fail("clientName", "\"" + port.clientName + "\" already has a port");
+            continue;  // counted among the switch's uplinks
+        }
+        if (port.clientKind == PortClientKind::VmAdapter) {
+            const WorldRecord* world = worlds.Find(port.worldId);
+            if (world == nullptr) fail("worldId", "no world " + std::to_string(port.worldId));
+            if (port.clientName.rfind(world->vmName + ".", 0) != 0)
+                fail("clientName", "expected an adapter of \"" + world->vmName + "\" (\"" + world->vmName + ".eth0\")");
+        }
+        auto count = used.emplace(port.portset, static_cast<int>(uplinks.size())).first;
+        if (++count->second > numPorts)
+            fail("", "\"" + port.portset + "\" has no free port left (" + std::to_string(numPorts) + " ports)");
     }
 }
 
@@ -60,15 +100,30 @@ namespace {
 // The families of the names of the ports' clients, shared with the sections
 // of kernel interfaces and VMs when they join, so that their copies match.
 constexpr const char* kInterfaceNames = "tesselNic";
-constexpr const char* kVmNames = "vm";
+constexpr const char* kVmNames = kVmNameFamily;
 
 // A VM adapter is named by its VM, a point and the adapter: the VM is copied,
 // the adapter keeps its name ("web01.eth0" -> "web02.eth0").
 std::string CopiedClientName(HostCopy& copy, const PortRecord& port) {
     if (port.clientKind == PortClientKind::TesselNic) return copy.Name(kInterfaceNames, port.clientName);
+    if (port.clientKind == PortClientKind::Uplink) return copy.Name(PnicRecord::kKind, port.clientName);
     std::size_t point = port.clientName.rfind('.');
     if (point == std::string::npos) return copy.Name(kVmNames, port.clientName);
     return copy.Name(kVmNames, port.clientName.substr(0, point)) + port.clientName.substr(point);
+}
+
+// A copied adapter's address: the device part (the last three octets) moved
+// on by the copy's number, the vendor part kept.
+std::string CopiedMac(const std::string& mac, int copyIndex) {
+    unsigned int octets[6] = {};
+    if (std::sscanf(mac.c_str(), "%2x:%2x:%2x:%2x:%2x:%2x", &octets[0], &octets[1], &octets[2], &octets[3],
+                    &octets[4], &octets[5]) != 6)
+        return mac;
+    unsigned int device = ((octets[3] << 16) | (octets[4] << 8) | octets[5]) + static_cast<unsigned int>(copyIndex) * 0x100;
+    char text[18];
+    std::snprintf(text, sizeof text, "%02x:%02x:%02x:%02x:%02x:%02x", octets[0], octets[1], octets[2],
+                  (device >> 16) & 0xff, (device >> 8) & 0xff, device & 0xff);
+    return text;
 }
 
 }  // namespace
@@ -77,16 +132,21 @@ void PortsSection::AddCopy(HostCopy& copy, Json& value) const {
     for (PortRecord port : ports_) {
         port.name = copy.Name(PortRecord::kKind, port.name);
         port.id = std::stoll(port.name);
-        port.portset = copy.Name(StandardSwitchRecord::kKind, port.portset);
-        port.portGroup = copy.Name(PortGroupRecord::kKind, port.portGroup);
+        const bool distributed = !port.dvPort.empty();
+        port.portset = copy.Name(distributed ? DVSwitchRecord::kKind : StandardSwitchRecord::kKind, port.portset);
+        if (!port.portGroup.empty()) port.portGroup = copy.Name(PortGroupRecord::kKind, port.portGroup);
+        if (port.worldId != 0) port.worldId = std::stoll(copy.Name(WorldRecord::kKind, std::to_string(port.worldId)));
+        if (!port.teamUplink.empty()) port.teamUplink = copy.Name(PnicRecord::kKind, port.teamUplink);
+        for (std::string& mac : port.macAddresses) mac = CopiedMac(mac, copy.Index());
         port.clientName = CopiedClientName(copy, port);
         value.push_back(port.ToJson());
     }
 }
 
 int PortsSection::PortsOn(const std::string& vswitch) const {
-    return static_cast<int>(
-        std::count_if(ports_.begin(), ports_.end(), [&](const PortRecord& port) { return port.portset == vswitch; }));
+    return static_cast<int>(std::count_if(ports_.begin(), ports_.end(), [&](const PortRecord& port) {
+        return port.portset == vswitch && port.clientKind != PortClientKind::Uplink;
+    }));
 }
 
 namespace {

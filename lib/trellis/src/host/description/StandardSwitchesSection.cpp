@@ -83,6 +83,13 @@ void CopyUplinkOrder(HostCopy& copy, StoredPolicies& policies) {
     for (std::string& uplink : policies.teaming.uplinkOrder) uplink = copy.Name(PnicRecord::kKind, uplink);
 }
 
+std::map<std::string, std::string> StandardSwitchesSection::Uplinks() const {
+    std::map<std::string, std::string> uplinks;
+    for (const StandardSwitchRecord& vswitch : switches_)
+        for (const std::string& uplink : vswitch.uplinks) uplinks.emplace(uplink, vswitch.name);
+    return uplinks;
+}
+
 const StandardSwitchRecord* StandardSwitchesSection::Find(const std::string& name) const {
     for (const StandardSwitchRecord& vswitch : switches_)
         if (vswitch.name == name) return &vswitch;
