@@ -22,6 +22,7 @@
 #include "trellis/host/Operation.h"
 #include "trellis/network/NetworkInfoImpl.h"
 #include "trellis/network/PnicImpl.h"
+#include "trellis/network/PortImpl.h"
 #include "trellis/util/Exec.h"
 
 namespace {
@@ -58,6 +59,26 @@ const Words kSwitchFailoverSet = {"network", "vswitch", "standard", "policy", "f
 const Words kGroupSecurityGet = {"network", "vswitch", "standard", "portgroup", "policy", "security", "get", "-p", "Guest Network"};
 const Words kGroupShapingGet = {"network", "vswitch", "standard", "portgroup", "policy", "shaping", "get", "-p", "Guest Network"};
 const Words kGroupFailoverGet = {"network", "vswitch", "standard", "portgroup", "policy", "failover", "get", "-p", "Guest Network"};
+
+const Words kDvsList = {"network", "vswitch", "dvs", "korvex", "list"};
+const Words kLacpConfig = {"network", "vswitch", "dvs", "korvex", "lacp", "config", "get"};
+const Words kLacpStatus = {"network", "vswitch", "dvs", "korvex", "lacp", "status", "get"};
+const Words kLacpTimeout = {"network", "vswitch", "dvs", "korvex", "lacp", "timeout", "set", "-t", "true", "-l", "1", "-s", "dvSwitch0"};
+const Words kVmList = {"network", "vm", "list"};
+const Words kVmPortList = {"network", "vm", "port", "list", "-w", "69312"};
+const Words kPortStats = {"network", "port", "stats", "get", "-p", "33554437"};
+const Words kFilterStats = {"network", "port", "filter", "stats", "get", "-p", "33554437"};
+
+// dvSwitch1 with an uplink port that has LACP on and no NIC: its LACP
+// configuration is found through the uplink ports' names.
+std::string UplinkPortWithoutNic() {
+    return TempHost::Edited([](TempHost::Json& d) {
+        d["distributedSwitches"][1]["ports"][3] = {{"id", "3"},
+                                                   {"portGroupId", "dvportgroup-200"},
+                                                   {"uplinkName", "uplink1"},
+                                                   {"lacp", {{"enabled", true}, {"mode", "passive"}}}};
+    });
+}
 
 std::string UnloadedFirewall() {
     return TempHost::Edited([](TempHost::Json& d) {
@@ -176,6 +197,44 @@ const std::vector<CommandRow>& CommandTable() {
         {"PortGroup::GetLocalTeamingPolicy", kGroupFailoverGet},
         {"PortGroup::ApplyTeamingPolicy",
          {"network", "vswitch", "standard", "portgroup", "policy", "failover", "set", "-p", "Guest Network", "-b", "true"}},
+        {"VirtualSwitchInfoImpl::GetDVSwitches", kDvsList},
+        {"DVSwitch::GetId", kDvsList},
+        {"DVSwitch::GetMtu", kDvsList},
+        {"DVSwitch::GetBeaconTimeout", kDvsList},
+        {"DVSwitch::GetCdpStatus", kDvsList},
+        {"DVSwitchImpl::IsKorvexBranded", kDvsList},
+        {"DVSwitch::GetDVPorts", kDvsList},
+        {"DVPort::GetPortId", kDvsList},
+        {"DVPort::IsInUse", kDvsList},
+        {"DVPort::GetPortGroupId", kDvsList},
+        {"DVSwitch::GetUplinkPortParams", kLacpConfig},
+        {"NetworkFactory::GetDVPort", kLacpConfig},
+        {"DVPort::GetLacpConfig", kLacpConfig},
+        {"DVPort::GetUplinkName", kLacpConfig},
+        {"DVSwitch::GetLagConfigs", kLacpConfig},
+        {"DVSwitch::GetUplinkPortNames", {"network", "vswitch", "dvs", "korvex", "lacp", "config", "get", "-s", "dvSwitch1"}},
+        {"DVSwitch::GetUplinkPort", {"network", "vswitch", "dvs", "korvex", "lacp", "config", "get", "-s", "dvSwitch1"},
+         UplinkPortWithoutNic()},
+        {"DVSwitch::GetLacpGroups", kLacpStatus},
+        {"DVSwitch::FreeLacpGroups", {"network", "vswitch", "dvs", "korvex", "lacp", "stats", "get"}},
+        {"NetworkFactory::GetDVSwitchByName", kLacpTimeout},
+        {"DVSwitch::SetLacpTimeout", kLacpTimeout},
+        {"VirtualSwitchInfoImpl::GetAllSwitches", kVmList},
+        {"VirtualSwitchInfoImpl::IsLegacySwitch", kVmList},
+        {"PortsetImpl::GetPorts", kVmList},
+        {"PortImpl::GetWorldId", kVmList},
+        {"PortImpl::GetPortGroupName", kVmList},
+        {"PortImpl::GetDVPortId", kVmList},
+        {"DVPortImpl::GetDVPortgroupId", kVmList},
+        {"WorldImpl::GetWorldName", kVmList},
+        {"PortImpl::GetPortId", kVmPortList},
+        {"PortImpl::GetMacAddresses", kVmPortList},
+        {"PortImpl::GetIpv4Address", kVmPortList},
+        {"PortImpl::GetTeamUplink", kVmPortList},
+        {"PortImpl::GetFilterStats", kVmPortList},
+        {"PortImpl::GetByteStats", kPortStats},
+        {"PortImpl::GetPacketStats", kPortStats},
+        {"PortImpl::GetClientType", kFilterStats},
     };
     return rows;
 }
@@ -191,6 +250,10 @@ const std::vector<DirectRow>& DirectTable() {
     static const std::vector<DirectRow> rows = {
         {"NetworkInfoImpl::GetPnicByName", Thrown([] {
              std::unique_ptr<Gantry::Network::Pnic>(Trellis::Network::NetworkInfoImpl().GetPnicByName("pnet0"));
+         })},
+        // vm port list reports this failure as an uplink port id of 0.
+        {"PnicImpl::GetUplinkPort", Thrown([] {
+             std::unique_ptr<Trellis::Network::PortImpl>(Trellis::Network::PnicImpl("pnet0").GetUplinkPort());
          })},
         // No command runs a shell command line yet.
         {"Trellis_Exec",
