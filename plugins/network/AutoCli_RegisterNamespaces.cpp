@@ -11,7 +11,16 @@
 #include "FirewallRulesetSet.h"
 #include "FirewallSet.h"
 #include "FirewallUnload.h"
+#include "LacpGetConfig.h"
+#include "LacpGetStats.h"
+#include "LacpGetStatus.h"
+#include "LacpSetTimeout.h"
 #include "NamespaceTreeBuilder.h"
+#include "PortFilterStatsGet.h"
+#include "PortStatsGet.h"
+#include "VMList.h"
+#include "VMPortList.h"
+#include "VirtualSwitchDVSKorvexList.h"
 #include "VirtualSwitchPortGroupAdd.h"
 #include "VirtualSwitchPortGroupList.h"
 #include "VirtualSwitchPortGroupPolicyFailoverGet.h"
@@ -171,16 +180,21 @@ std::vector<TreeRow> NetworkTree() {
                      "Commands to retrieve Distributed Virtual Switch information"),
         NamespaceRow("network vswitch dvs korvex",
                      "Commands to retrieve Korvex Meridon Distributed Switch information"),
+        CommandRow<VirtualSwitchDVSKorvexList>("network vswitch dvs korvex list"),
         NamespaceRow("network vswitch dvs korvex lacp",
                      "A set of commands for LACP related operations"),
         NamespaceRow("network vswitch dvs korvex lacp config",
                      "Command to get LACP configuration"),
+        CommandRow<LacpGetConfig>("network vswitch dvs korvex lacp config get"),
         NamespaceRow("network vswitch dvs korvex lacp status",
                      "Command to get LACP port status"),
+        CommandRow<LacpGetStatus>("network vswitch dvs korvex lacp status get"),
         NamespaceRow("network vswitch dvs korvex lacp stats",
                      "Command to get LACP protocol statistics"),
+        CommandRow<LacpGetStats>("network vswitch dvs korvex lacp stats get"),
         NamespaceRow("network vswitch dvs korvex lacp timeout",
                      "Command to set LACP LAG timeout"),
+        CommandRow<LacpSetTimeout>("network vswitch dvs korvex lacp timeout set"),
         NamespaceRow("network firewall",
                      "A set of commands for firewall related operations"),
         CommandRow<FirewallGet>("network firewall get"),
@@ -204,14 +218,18 @@ std::vector<TreeRow> NetworkTree() {
                      "Commands to get information about a port"),
         NamespaceRow("network port stats",
                      "Commands to get port statistics"),
+        CommandRow<PortStatsGet>("network port stats get"),
         NamespaceRow("network port filter",
                      "Commands to get port filter information"),
         NamespaceRow("network port filter stats",
                      "Commands to get port filter statistics"),
+        CommandRow<PortFilterStatsGet>("network port filter stats get"),
         NamespaceRow("network vm",
                      "A set of commands for VM related operations"),
+        CommandRow<VMList>("network vm list"),
         NamespaceRow("network vm port",
                      "Command to list ports of a given VM"),
+        CommandRow<VMPortList>("network vm port list"),
     };
 }
 

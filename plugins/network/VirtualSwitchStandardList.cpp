@@ -1,10 +1,9 @@
 #include "VirtualSwitchStandardList.h"
 
-#include <algorithm>
 #include <vector>
 
 #include "CommandSupport.h"
-#include "gantry/network/Pnic.h"
+#include "KnownUplinks.h"
 #include "gantry/network/PortGroup.h"
 #include "gantry/network/VirtualSwitch.h"
 #include "trellis/network/NetworkInfoImpl.h"
@@ -19,28 +18,11 @@ namespace {
 const Parameter kVswitchName = Parameter::String(
     "vswitch-name", "v", "Limit the output of this command to only virtual switches with the given name.");
 
-std::vector<std::string> PnicNames(Trellis::Network::NetworkInfoImpl& networkInfo) {
-    OwnedVector<Gantry::Network::Pnic> pnics(networkInfo.GetPnics());
-    std::vector<std::string> names;
-    for (Gantry::Network::Pnic* pnic : pnics) names.push_back(pnic->GetName());
-    return names;
-}
-
 std::vector<std::string> PortGroupNames(Trellis::Network::VirtualSwitchImpl& vswitch) {
     OwnedVector<Gantry::Network::PortGroup> portGroups(vswitch.GetPortGroups());
     std::vector<std::string> names;
     for (Gantry::Network::PortGroup* portGroup : portGroups) names.push_back(portGroup->GetName());
     return names;
-}
-
-// An uplink that the host does not own as a physical NIC is not shown.
-std::vector<std::string> KnownUplinks(std::vector<std::string> uplinks, std::vector<std::string> const& pnicNames) {
-    uplinks.erase(std::remove_if(uplinks.begin(), uplinks.end(),
-                                 [&](std::string const& uplink) {
-                                     return std::find(pnicNames.begin(), pnicNames.end(), uplink) == pnicNames.end();
-                                 }),
-                  uplinks.end());
-    return uplinks;
 }
 
 }  // namespace
