@@ -98,12 +98,9 @@ TEST(VMPortList, ListsTheWorldsPortsOnBothKindsOfSwitch) {
     EXPECT_EQ(ports[0], Json::parse(R"({"Port ID":33554437,"vSwitch":"switch0","Portgroup":"Guest Network",
         "DVPort ID":"","MAC Address":"00:50:56:a1:00:01","IP Address":"192.0.2.21","Team Uplink":"pnet0",
         "Uplink Port ID":33554434,"Active Filters":["fw-agent.0","mon-agent.0"]})"));
-    EXPECT_EQ(ports[1]["Port ID"], 33554451);
-    EXPECT_EQ(ports[1]["vSwitch"], "dvSwitch0");
-    EXPECT_EQ(ports[1]["Portgroup"], "dvportgroup-101");
-    EXPECT_EQ(ports[1]["DVPort ID"], "0");
-    EXPECT_EQ(ports[1]["Team Uplink"], "pnet4");
-    EXPECT_EQ(ports[1]["Uplink Port ID"], 33554449);
+    EXPECT_EQ(ports[1], Json::parse(R"({"Port ID":33554451,"vSwitch":"dvSwitch0","Portgroup":"dvportgroup-101",
+        "DVPort ID":"0","MAC Address":"00:50:56:a1:00:03","IP Address":"198.51.100.21","Team Uplink":"pnet4",
+        "Uplink Port ID":33554449,"Active Filters":["fw-agent.1"]})"));
 }
 
 TEST(VMPortList, WorldZeroListsThePortsThatBelongToNoVm) {
@@ -161,7 +158,6 @@ TEST(PortStatsGet, UnicastIsWhatIsNeitherBroadcastNorMulticast) {
         "Multicast packets received":20,"Multicast packets sent":10,"Unicast packets received":0,
         "Unicast packets sent":85,"Receive packets dropped":4,"Transmit packets dropped":3}])"));
     EXPECT_EQ(RunCommand<PortStatsGet>({"-p", "33554451"}).Parsed()[0]["Port ID"], 33554451);
-    ExpectFailure(RunCommand<PortStatsGet>({"-p", "12345"}), "Couldn't find requested port");
     for (const char* operation :
          {"VirtualSwitchInfoImpl::GetAllSwitches", "PortImpl::GetByteStats", "PortImpl::GetPacketStats"}) {
         SCOPED_TRACE(operation);
