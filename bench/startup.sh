@@ -54,6 +54,15 @@ $c network vswitch standard portgroup policy shaping get -p "Guest Network"
 $c network vswitch standard portgroup policy shaping set -p "Guest Network" -u
 $c network vswitch standard portgroup remove -p BenchGroup -v bench0
 $c network vswitch standard remove -v bench0
+$c network vswitch dvs korvex list
+$c network vswitch dvs korvex lacp config get
+$c network vswitch dvs korvex lacp status get
+$c network vswitch dvs korvex lacp stats get
+$c network vswitch dvs korvex lacp timeout set -s dvSwitch0 -l 1 -t false
+$c network vm list
+$c network vm port list -w 69312
+$c network port stats get -p 33554437
+$c network port filter stats get -p 33554437
 $c network firewall unload
 $c network firewall load
 LINES
