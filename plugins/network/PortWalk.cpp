@@ -5,6 +5,7 @@
 #include "CommandSupport.h"
 #include "gantry/network/Portset.h"
 #include "trellis/network/DVPortImpl.h"
+#include "trellis/network/PortsetImpl.h"
 #include "trellis/network/VirtualSwitchImpl.h"
 
 namespace KorvexCli {
@@ -24,7 +25,7 @@ void WalkSwitchPorts(Trellis::Network::VirtualSwitchInfoImpl& vswitchInfo,
             distributed = new Trellis::Network::DVSwitchImpl(name, numPorts);
             handle.reset(distributed);
         }
-        WalkedSwitch walked{name, *handle, distributed};
+        WalkedSwitch walked{name, distributed};
         OwnedVector<Trellis::Network::PortImpl> ports(handle->GetPorts());
         for (Trellis::Network::PortImpl* port : ports)
             if (!visit(walked, *port)) return;

@@ -5,17 +5,15 @@
 
 #include "trellis/network/DVSwitchImpl.h"
 #include "trellis/network/PortImpl.h"
-#include "trellis/network/PortsetImpl.h"
 #include "trellis/network/VirtualSwitchInfoImpl.h"
 
 namespace KorvexCli {
 namespace NetworkNamespace {
 
-// One switch of the host as the port walk sees it: a handle made on its name.
+// One switch of the host as the port walk sees it.
 struct WalkedSwitch {
     std::string name;
-    Trellis::Network::PortsetImpl& handle;
-    // The same handle when the switch is a distributed one, else null.
+    // The walk's handle on the switch when it is a distributed one, else null.
     Trellis::Network::DVSwitchImpl* distributed;
 };
 
