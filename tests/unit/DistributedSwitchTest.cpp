@@ -144,7 +144,10 @@ TEST(LacpGetConfig, AGroupTakesItsSettingFromItsLastPortAndALagIsEnabledWhatever
         Dvs(d, "dvSwitch0")["lags"].push_back(
             {{"id", "7"}, {"name", "lag7"}, {"mode", "passive"}, {"loadBalance", 20}, {"uplinkCount", 0}});
     });
-    Json rows = RunCommand<LacpGetConfig>().Parsed();
+    CommandRun run = RunCommand<LacpGetConfig>();
+    // The field list is joined from the field names when the plug-in loads.
+    EXPECT_EQ(run.hints.at("fields:LACP"), "DVS Name,LAG Name,LAG ID,NICs,Enabled,Mode,Load balance");
+    Json rows = run.Parsed();
     ASSERT_EQ(rows.size(), 3u);
     EXPECT_EQ(rows[0]["NICs"], "lag1-0");
     EXPECT_EQ(rows[0]["Enabled"], false);
