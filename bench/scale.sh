@@ -24,6 +24,9 @@ one_object=(
   "network vswitch standard list -v switch0"
   "network vswitch standard set -v switch0 -c listen"
   "network vswitch standard portgroup set -p \"Guest Network\" -v 0"
+  "network vswitch dvs korvex list -v dvSwitch0"
+  "network vswitch dvs korvex lacp status get -s dvSwitch0"
+  "network vswitch dvs korvex lacp timeout set -t false -l 1 -s dvSwitch0"
 )
 lists=(
   "network firewall ruleset list"
@@ -31,6 +34,8 @@ lists=(
   "network firewall ruleset allowedip list"
   "network vswitch standard list"
   "network vswitch standard portgroup list"
+  "network vswitch dvs korvex list"
+  "network vm list"
 )
 
 # Each command runs on the scaled host paired with a run on the default host.

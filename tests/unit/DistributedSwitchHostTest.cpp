@@ -81,6 +81,8 @@ TEST(DistributedSwitchHost, TheDescriptionRefusesWhatCannotBe) {
          "ports[8].dvPort: DVPort 0 is already in use"},
         {[](Json& d) { PortWithId(d, 33554448)["clientName"] = "pnet5"; },
          "ports[4].clientName: DVPort 8 has no NIC \"pnet5\""},
+        {[](Json& d) { PortWithId(d, 33554437)["stats"]["bytesSent"] = 9223372036854775808ull; },
+         "ports[2].stats.bytesSent: expected an integer from 0 to 9223372036854775807"},
         {[](Json& d) { PortWithId(d, 33554437)["stats"]["broadcastReceived"] = 12512102; },
          "ports[2].stats: more multicast and broadcast packets received than packets received"},
     };
