@@ -6,6 +6,7 @@ namespace Gantry {
 namespace Network {
 
 class DVPort;
+class NetworkInfo;
 class DVSwitch;
 class PortGroup;
 struct DVPortParam;
@@ -15,6 +16,8 @@ class VirtualSwitch;
 // caller. The implementation library provides the operations.
 class NetworkFactory {
 public:
+    // The host's network inventory.
+    static NetworkInfo* GetNetworkInfo();
     // The port group of that name on any standard switch, or null.
     static PortGroup* GetPortGroupByName(std::string const& name);
     // The standard switch of that name; throws GantryException when there is

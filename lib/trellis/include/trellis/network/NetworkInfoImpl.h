@@ -3,6 +3,7 @@
 #include <string>
 #include <vector>
 
+#include "gantry/network/NetworkInfo.h"
 #include "gantry/network/Pnic.h"
 #include "gantry/network/PortGroup.h"
 
@@ -12,10 +13,12 @@ namespace Network {
 // The host's network inventory. A stack object; what it returns belongs to
 // the caller. Its constructor is a host operation ("NetworkInfoImpl::NetworkInfoImpl"),
 // so an armed fault makes it throw.
-class NetworkInfoImpl {
+class NetworkInfoImpl : public virtual Gantry::Network::NetworkInfo {
 public:
     NetworkInfoImpl();
-    ~NetworkInfoImpl();
+    ~NetworkInfoImpl() override;
+
+    int GetNetstackInstanceState(std::string const& key) override;
 
     // Every physical NIC, in the host's order.
     std::vector<Gantry::Network::Pnic*> GetPnics();

@@ -8,6 +8,7 @@
 #include "gantry/network/FilterStats.h"
 #include "gantry/network/Ipv4Address.h"
 #include "gantry/network/MacAddress.h"
+#include "gantry/network/Port.h"
 #include "trellis/host/records/PortRecord.h"
 
 namespace Trellis {
@@ -34,7 +35,7 @@ struct PortPacketStats {
 // A port in use on a switch of the simulated host, standard or distributed:
 // a VM's adapter, a kernel interface or an uplink. It answers from the
 // snapshot of its record taken by the lookup that made it.
-class PortImpl : public virtual Gantry::Lib::GantryObject {
+class PortImpl : public virtual Gantry::Network::Port {
 public:
     // GetClientType: what is connected to the port.
     static constexpr int CLIENT_TYPE_TESSEL_NIC = 3;
@@ -44,7 +45,7 @@ public:
     explicit PortImpl(Trellis::Host::PortRecord snapshot);
     ~PortImpl() override;
 
-    int GetPortId();
+    int GetPortId() override;
     // The world (running VM) that owns the port; 0 when none does.
     int GetWorldId();
     // The port group on a standard switch; empty on a distributed one.

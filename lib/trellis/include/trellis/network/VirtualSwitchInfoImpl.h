@@ -40,6 +40,8 @@ public:
 
     // Every distributed switch, in the order they were created.
     std::vector<Gantry::Network::DVSwitch*> GetDVSwitches();
+    // The distributed switch of that name, or null.
+    Gantry::Network::DVSwitch* GetDVSwitchByName(std::string const& name);
     // Every switch: the standard ones, then the distributed ones.
     std::vector<Gantry::Network::Portset*> GetAllSwitches();
     // Whether the named switch is a standard one (false for a distributed
