@@ -123,7 +123,8 @@ TEST(HostDescription, ImportReplacesTheWholeHost) {
     Json empty = Json::parse(ExportHost());
     EXPECT_EQ(empty, Json::parse(R"({"format": 1, "modules": [],
         "firewall": {"enabled": false, "defaultAction": "PASS", "rulesetsLoaded": false, "rulesets": [], "dynamicRules": []},
-        "nics": [], "standardSwitches": [], "portGroups": [], "distributedSwitches": [], "worlds": [], "ports": [],
+        "nics": [], "standardSwitches": [], "portGroups": [], "distributedSwitches": [], "netstacks": [], "worlds": [],
+        "ports": [], "tesselNics": [],
         "faults": [], "exec": []})"));
     EXPECT_TRUE(ListFaults().empty());  // the faults were replaced too, and this process knows it
 }

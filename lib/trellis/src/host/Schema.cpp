@@ -3,6 +3,7 @@
 #include <string>
 
 #include "host/DistributedMigration.h"
+#include "host/InterfaceMigration.h"
 #include "host/Sqlite.h"
 #include "host/description/DescriptionIo.h"
 #include "trellis/host/Transaction.h"
@@ -45,6 +46,7 @@ const std::vector<Migration>& Migrations() {
          }},
         {5, "running VMs, distributed switches, and the VMs, addresses and counters of the ports in use",
          [](Transaction& t) { MigrateToDistributedSwitches(t); }},
+        {6, "netstack instances and kernel interfaces", [](Transaction& t) { MigrateToKernelInterfaces(t); }},
     };
     return steps;
 }

@@ -2,6 +2,7 @@
 
 #include <utility>
 
+#include "ConnectionPoints.h"
 #include "gantry/lib/GantryException.h"
 #include "host/StoredText.h"
 #include "trellis/host/Operation.h"
@@ -22,6 +23,8 @@ const Operation kGetPortGroupId("DVPort::GetPortGroupId");
 const Operation kGetUplinkName("DVPort::GetUplinkName");
 const Operation kGetLacpConfig("DVPort::GetLacpConfig");
 const Operation kGetDVPortgroupId("DVPortImpl::GetDVPortgroupId");
+const Operation kGetConnectionId("DVPortImpl::GetConnectionId");
+const Operation kSetConnectionId("DVPortImpl::SetConnectionId");
 
 DVPortRecord RequirePort(Transaction const& t, std::string const& dvsId, std::string const& portId) {
     std::optional<DVPortRecord> port = t.Find<DVPortRecord>(DVPortRecord::KeyOf(dvsId, portId));
@@ -42,6 +45,9 @@ std::vector<std::string> ClientsOf(Transaction const& t, DVPortRecord const& por
 }  // namespace
 
 DVPortImpl::DVPortImpl(std::string const& dvsId, std::string const& portId) : dvsId_(dvsId), portId_(portId) {}
+
+DVPortImpl::DVPortImpl(Gantry::Network::DVPortParam const& param)
+    : dvsId_(param.dvsId), portId_(param.portId), connectionId_(param.connectionId) {}
 
 DVPortImpl::DVPortImpl(DVPortRecord snapshot, std::vector<std::string> clients)
     : dvsId_(snapshot.dvsId), portId_(snapshot.portId), record_(std::move(snapshot)), clients_(std::move(clients)) {}
@@ -84,6 +90,46 @@ Gantry::Network::LacpPortConfig DVPortImpl::GetLacpConfig() {
 }
 
 std::string DVPortImpl::GetDVPortgroupId() { return Record(kGetDVPortgroupId).portGroupId; }
+
+bool DVPortImpl::IsValid() {
+    return kConnectionPointIsValid.Read(
+        [&](Transaction& t) { return t.Contains<DVPortRecord>(DVPortRecord::KeyOf(dvsId_, portId_)); });
+}
+
+unsigned int DVPortImpl::GetConnectionId() {
+    return kGetConnectionId.Read([&](Transaction& t) { return RequirePort(t, dvsId_, portId_).connectionId; });
+}
+
+void DVPortImpl::SetConnectionId(unsigned int connectionId) {
+    kSetConnectionId.Write([&](Transaction& t) {
+        DVPortRecord port = RequirePort(t, dvsId_, portId_);
+        port.connectionId = connectionId;
+        t.Put(port);
+    });
+    record_.reset();
+}
+
+int DVPortImpl::GetType() {
+    kConnectionPointGetType.Check();
+    return TYPE_DVPORT;
+}
+
+std::string DVPortImpl::GetPortsetName() { return Record(kConnectionPointGetPortsetName).dvswitch; }
+
+std::string DVPortImpl::GetPortGroupName() {
+    kConnectionPointGetPortGroupName.Check();
+    RefusePayload("DVPort " + portId_, "port group");
+}
+
+Gantry::Network::DVPortParam DVPortImpl::GetDVPortParam() {
+    kConnectionPointGetDVPortParam.Check();
+    return {dvsId_, portId_, connectionId_};
+}
+
+Gantry::Network::OpaqueNetworkParam DVPortImpl::GetOpaqueNetworkParam() {
+    kConnectionPointGetOpaqueNetworkParam.Check();
+    RefusePayload("DVPort " + portId_, "opaque network");
+}
 
 }  // namespace Network
 }  // namespace Trellis

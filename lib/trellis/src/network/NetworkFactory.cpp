@@ -13,6 +13,7 @@
 #include "host/StoredText.h"
 #include "trellis/network/DVPortImpl.h"
 #include "trellis/network/DVSwitchImpl.h"
+#include "trellis/network/NetworkInfoImpl.h"
 #include "trellis/host/Operation.h"
 #include "trellis/network/PortGroupImpl.h"
 #include "trellis/network/VirtualSwitchImpl.h"
@@ -30,8 +31,14 @@ const Operation kGetPortGroupByName("NetworkFactory::GetPortGroupByName");
 const Operation kGetVirtualSwitchById("NetworkFactory::GetVirtualSwitchById");
 const Operation kGetDVSwitchByName("NetworkFactory::GetDVSwitchByName");
 const Operation kGetDVPort("NetworkFactory::GetDVPort");
+const Operation kGetNetworkInfo("NetworkFactory::GetNetworkInfo");
 
 }  // namespace
+
+NetworkInfo* NetworkFactory::GetNetworkInfo() {
+    kGetNetworkInfo.Check();
+    return new Trellis::Network::NetworkInfoImpl();
+}
 
 PortGroup* NetworkFactory::GetPortGroupByName(std::string const& name) {
     std::optional<Trellis::Host::PortGroupRecord> record = kGetPortGroupByName.Read(

@@ -1,8 +1,10 @@
 #include "trellis/network/NetworkInfoImpl.h"
 
+#include <optional>
 #include <utility>
 
 #include "trellis/host/Operation.h"
+#include "trellis/host/records/NetstackRecord.h"
 #include "trellis/host/records/PnicRecord.h"
 #include "trellis/host/records/SwitchRecords.h"
 #include "trellis/network/PnicImpl.h"
@@ -19,6 +21,7 @@ using Trellis::Host::PortGroupRecord;
 using Trellis::Host::Transaction;
 
 const Operation kConstruct("NetworkInfoImpl::NetworkInfoImpl");
+const Operation kGetNetstackInstanceState("NetworkInfo::GetNetstackInstanceState");
 const Operation kGetPnics("NetworkInfoImpl::GetPnics");
 const Operation kGetPnicByName("NetworkInfoImpl::GetPnicByName");
 const Operation kGetAllPortGroups("NetworkInfoImpl::GetAllPortGroups");
@@ -47,6 +50,13 @@ std::vector<Gantry::Network::PortGroup*> NetworkInfoImpl::GetAllPortGroups() {
     std::vector<Gantry::Network::PortGroup*> groups;
     for (PortGroupRecord& record : records) groups.push_back(new PortGroupImpl(std::move(record)));
     return groups;
+}
+
+int NetworkInfoImpl::GetNetstackInstanceState(std::string const& key) {
+    return kGetNetstackInstanceState.Read([&](Transaction& t) {
+        std::optional<Trellis::Host::NetstackRecord> netstack = t.Find<Trellis::Host::NetstackRecord>(key);
+        return netstack && netstack->inKernel ? NETSTACK_STATE_IN_KERNEL : 0;
+    });
 }
 
 }  // namespace Network

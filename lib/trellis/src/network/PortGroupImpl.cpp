@@ -2,6 +2,7 @@
 
 #include <utility>
 
+#include "ConnectionPoints.h"
 #include "PolicyInheritance.h"
 #include "SwitchStore.h"
 #include "trellis/host/Operation.h"
@@ -32,6 +33,7 @@ const Operation kGetLocalShapingPolicy("PortGroup::GetLocalShapingPolicy");
 const Operation kApplyShapingPolicy("PortGroup::ApplyShapingPolicy");
 const Operation kGetVirtualSwitch("PortGroup::GetVirtualSwitch");
 const Operation kGetActiveClients("PortGroupImpl::GetActiveClients");
+const Operation kConstruct("PortGroupImpl::PortGroupImpl");
 
 // The group's policies in force, read with its switch's at the call.
 StoredPolicies InForce(Operation const& operation, PortGroupRecord const& group) {
@@ -40,7 +42,39 @@ StoredPolicies InForce(Operation const& operation, PortGroupRecord const& group)
 
 }  // namespace
 
+PortGroupImpl::PortGroupImpl(std::string const& name)
+    : snapshot_(kConstruct.Read([&](Transaction& t) { return SwitchStore::RequirePortGroup(t, name); })) {}
+
 PortGroupImpl::PortGroupImpl(PortGroupRecord snapshot) : snapshot_(std::move(snapshot)) {}
+
+int PortGroupImpl::GetType() {
+    kConnectionPointGetType.Check();
+    return TYPE_PORTGROUP;
+}
+
+bool PortGroupImpl::IsValid() {
+    return kConnectionPointIsValid.Read([&](Transaction& t) { return t.Contains<PortGroupRecord>(snapshot_.name); });
+}
+
+std::string PortGroupImpl::GetPortsetName() {
+    kConnectionPointGetPortsetName.Check();
+    return snapshot_.vswitch;
+}
+
+std::string PortGroupImpl::GetPortGroupName() {
+    kConnectionPointGetPortGroupName.Check();
+    return snapshot_.name;
+}
+
+Gantry::Network::DVPortParam PortGroupImpl::GetDVPortParam() {
+    kConnectionPointGetDVPortParam.Check();
+    RefusePayload("port group " + snapshot_.name, "DVPort");
+}
+
+Gantry::Network::OpaqueNetworkParam PortGroupImpl::GetOpaqueNetworkParam() {
+    kConnectionPointGetOpaqueNetworkParam.Check();
+    RefusePayload("port group " + snapshot_.name, "opaque network");
+}
 
 PortGroupImpl::~PortGroupImpl() {}
 

@@ -29,6 +29,7 @@ const Operation kRemoveVirtualSwitch("VirtualSwitchInfoImpl::RemoveVirtualSwitch
 const Operation kGetDVSwitches("VirtualSwitchInfoImpl::GetDVSwitches");
 const Operation kGetAllSwitches("VirtualSwitchInfoImpl::GetAllSwitches");
 const Operation kIsLegacySwitch("VirtualSwitchInfoImpl::IsLegacySwitch");
+const Operation kGetDVSwitchByName("VirtualSwitchInfoImpl::GetDVSwitchByName");
 
 std::vector<Gantry::Network::DVSwitch*> DVSwitchesOf(Transaction const& t) {
     std::vector<Gantry::Network::DVSwitch*> switches;
@@ -127,6 +128,15 @@ std::vector<Gantry::Network::Portset*> VirtualSwitchInfoImpl::GetAllSwitches() {
             switches.push_back(new VirtualSwitchImpl(std::move(record)));
         for (Gantry::Network::DVSwitch* dvs : DVSwitchesOf(t)) switches.push_back(dvs);
         return switches;
+    });
+}
+
+Gantry::Network::DVSwitch* VirtualSwitchInfoImpl::GetDVSwitchByName(std::string const& name) {
+    return kGetDVSwitchByName.Read([&](Transaction& t) -> Gantry::Network::DVSwitch* {
+        std::optional<Trellis::Host::DVSwitchRecord> record = t.Find<Trellis::Host::DVSwitchRecord>(name);
+        if (!record) return nullptr;
+        std::vector<std::string> uplinks = DVSwitchStore::UplinksOf(t, name);
+        return new DVSwitchImpl(std::move(*record), std::move(uplinks));
     });
 }
 

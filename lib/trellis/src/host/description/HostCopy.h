@@ -41,6 +41,16 @@ public:
     // The name in this copy of the object named name in the original.
     std::string Name(const std::string& family, const std::string& name);
 
+    // Addresses of a copy, each unique to it (texts as the original's):
+    // - a MAC address moves on by 256 per copy in its last three octets;
+    // - an IPv4 address takes the copy's own /24 of 10.0.0.0/8: 10.<copy's
+    //   number, two octets>.<its last octet>;
+    // - an IPv6 address (with or without "/prefix") takes the copy's number
+    //   as its third group: 2001:db8::10 becomes 2001:db8:2::10 in copy 2.
+    std::string Mac(const std::string& mac) const;
+    std::string Ipv4(const std::string& address) const;
+    std::string Ipv6(const std::string& network) const;
+
 private:
     struct Span {
         std::int64_t min;

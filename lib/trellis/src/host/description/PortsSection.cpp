@@ -3,7 +3,6 @@
 // has more ports in use (clients and uplinks) than it has ports.
 
 #include <algorithm>
-#include <cstdio>
 #include <map>
 #include <set>
 #include <string>
@@ -13,6 +12,7 @@
 #include "host/description/SwitchingSections.h"
 #include "trellis/host/Transaction.h"
 #include "trellis/host/records/PnicRecord.h"
+#include "trellis/host/records/TslNicRecord.h"
 
 namespace Trellis {
 namespace Host {
@@ -112,20 +112,6 @@ std::string CopiedClientName(HostCopy& copy, const PortRecord& port) {
     return copy.Name(kVmNames, port.clientName.substr(0, point)) + port.clientName.substr(point);
 }
 
-// A copied adapter's address: the device part (the last three octets) moved
-// on by the copy's number, the vendor part kept.
-std::string CopiedMac(const std::string& mac, int copyIndex) {
-    unsigned int octets[6] = {};
-    if (std::sscanf(mac.c_str(), "%2x:%2x:%2x:%2x:%2x:%2x", &octets[0], &octets[1], &octets[2], &octets[3],
-                    &octets[4], &octets[5]) != 6)
-        return mac;
-    unsigned int device = ((octets[3] << 16) | (octets[4] << 8) | octets[5]) + static_cast<unsigned int>(copyIndex) * 0x100;
-    char text[18];
-    std::snprintf(text, sizeof text, "%02x:%02x:%02x:%02x:%02x:%02x", octets[0], octets[1], octets[2],
-                  (device >> 16) & 0xff, (device >> 8) & 0xff, device & 0xff);
-    return text;
-}
-
 }  // namespace
 
 void PortsSection::AddCopy(HostCopy& copy, Json& value) const {
@@ -137,8 +123,11 @@ void PortsSection::AddCopy(HostCopy& copy, Json& value) const {
         if (!port.portGroup.empty()) port.portGroup = copy.Name(PortGroupRecord::kKind, port.portGroup);
         if (port.worldId != 0) port.worldId = std::stoll(copy.Name(WorldRecord::kKind, std::to_string(port.worldId)));
         if (!port.teamUplink.empty()) port.teamUplink = copy.Name(PnicRecord::kKind, port.teamUplink);
-        for (std::string& mac : port.macAddresses) mac = CopiedMac(mac, copy.Index());
+        for (std::string& mac : port.macAddresses) mac = copy.Mac(mac);
+        if (!port.ipv4Address.empty()) port.ipv4Address = copy.Ipv4(port.ipv4Address);
         port.clientName = CopiedClientName(copy, port);
+        // A host has 256 interface names: the copies past them have no interfaces.
+        if (port.clientKind == PortClientKind::TesselNic && TslNicRecord::NumberOf(port.clientName) < 0) continue;
         value.push_back(port.ToJson());
     }
 }
@@ -147,6 +136,12 @@ int PortsSection::PortsOn(const std::string& vswitch) const {
     return static_cast<int>(std::count_if(ports_.begin(), ports_.end(), [&](const PortRecord& port) {
         return port.portset == vswitch && port.clientKind != PortClientKind::Uplink;
     }));
+}
+
+const PortRecord* PortsSection::InterfacePort(const std::string& name) const {
+    for (const PortRecord& port : ports_)
+        if (port.clientKind == PortClientKind::TesselNic && port.clientName == name) return &port;
+    return nullptr;
 }
 
 namespace {

@@ -103,6 +103,8 @@ public:
 
     // The client ports on a switch (uplinks' ports are not counted).
     int PortsOn(const std::string& vswitch) const;
+    // The port of the kernel interface of that name, or null.
+    const PortRecord* InterfacePort(const std::string& name) const;
 
 private:
     std::vector<PortRecord> ports_;

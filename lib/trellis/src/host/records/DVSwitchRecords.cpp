@@ -191,6 +191,7 @@ Json DVPortRecord::ToDescriptionJson() const {
         if (!nic.empty()) port["nic"] = nic;
         port["lacp"] = Json{{"enabled", lacpEnabled}, {"mode", kLacpModeWords[lacpMode]}};
     }
+    if (connectionId != 0) port["connectionId"] = connectionId;
     return port;
 }
 
@@ -208,6 +209,9 @@ DVPortRecord DVPortRecord::FromDescription(const JsonReader& in, std::string con
     JsonReader lacp = in.Member("lacp");
     if (!record.IsUplink() && (!record.nic.empty() || lacp.IsPresent()))
         in.Fail("only an uplink port (with an uplinkName) has a NIC or a LACP setting");
+    if (in.Member("connectionId").IsPresent())
+        record.connectionId =
+            static_cast<std::uint32_t>(in.Int("connectionId", 0, std::numeric_limits<std::uint32_t>::max()));
     if (lacp.IsPresent()) {
         record.lacpEnabled = lacp.Bool("enabled");
         record.lacpMode = static_cast<int>(lacp.Word("mode", kLacpModeWords, 3));

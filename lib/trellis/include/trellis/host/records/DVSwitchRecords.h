@@ -96,6 +96,7 @@ struct DVPortRecord {
     std::string nic;         // the NIC connected to an uplink port, if any
     bool lacpEnabled = false;
     int lacpMode = 0;
+    std::uint32_t connectionId = 0;  // of the connection an interface holds on it; 0 for none
 
     static std::string KeyOf(std::string const& dvsId, std::string const& portId) { return dvsId + "/" + portId; }
     std::string Parent() const { return dvswitch; }
