@@ -7,12 +7,14 @@
 #include <vector>
 
 #include <gtest/gtest.h>
+#include <sqlite3.h>
 
 #include "SwitchTestSupport.h"
 #include "TempHost.h"
 #include "gantry/network/NetworkFactory.h"
 #include "gantry/network/NetworkInfo.h"
 #include "trellis/host/Description.h"
+#include "trellis/host/HostSession.h"
 #include "trellis/network/DVPortImpl.h"
 #include "trellis/network/DVSwitchImpl.h"
 #include "trellis/network/PortGroupImpl.h"
@@ -202,4 +204,18 @@ TEST(TslNicHost, TheDescriptionRefusesInterfacesThatCannotBe) {
         EXPECT_EQ(refusal, c.refusal);
     }
     EXPECT_TRUE(Trellis::Host::ExportHost() == before);
+}
+
+TEST(TslNicHost, AnOlderHostGetsTheDefaultNetstacksAndTheInterfaceOfItsPort) {
+    TempHost host;
+    Trellis::Host::CloseHost();
+    sqlite3* db = nullptr;
+    ASSERT_EQ(sqlite3_open(host.Path().c_str(), &db), SQLITE_OK);
+    ASSERT_EQ(sqlite3_exec(db, "DELETE FROM records WHERE kind IN ('tslnic', 'netstack'); PRAGMA user_version = 5;",
+                           nullptr, nullptr, nullptr),
+              SQLITE_OK);
+    sqlite3_close(db);
+    host.Reopen();
+    EXPECT_EQ(Section("netstacks").size(), 1u);
+    EXPECT_EQ(Section("tesselNics"), Json::parse(TempHost::Edited([](Json&) {}))["tesselNics"]);
 }
