@@ -11,6 +11,20 @@
 #include "FirewallRulesetSet.h"
 #include "FirewallSet.h"
 #include "FirewallUnload.h"
+#include "IpInterfaceAdd.h"
+#include "IpInterfaceIpv4Get.h"
+#include "IpInterfaceIpv4Set.h"
+#include "IpInterfaceIpv6AddressAdd.h"
+#include "IpInterfaceIpv6AddressList.h"
+#include "IpInterfaceIpv6AddressRemove.h"
+#include "IpInterfaceIpv6Get.h"
+#include "IpInterfaceIpv6Set.h"
+#include "IpInterfaceList.h"
+#include "IpInterfaceRemove.h"
+#include "IpInterfaceSet.h"
+#include "IpInterfaceTagAdd.h"
+#include "IpInterfaceTagGet.h"
+#include "IpInterfaceTagRemove.h"
 #include "LacpGetConfig.h"
 #include "LacpGetStats.h"
 #include "LacpGetStatus.h"
@@ -82,14 +96,28 @@ std::vector<TreeRow> NetworkTree() {
                      "Operations pertaining to Security Policy"),
         NamespaceRow("network ip interface",
                      "Operations having to do with the creation, management and deletion of Tessel network interfaces (tslnic)."),
+        CommandRow<IpInterfaceAdd>("network ip interface add"),
+        CommandRow<IpInterfaceRemove>("network ip interface remove"),
+        CommandRow<IpInterfaceList>("network ip interface list"),
+        CommandRow<IpInterfaceSet>("network ip interface set"),
         NamespaceRow("network ip interface ipv4",
                      "Commands to get and set IPv4 settings for tslnic."),
+        CommandRow<IpInterfaceIpv4Get>("network ip interface ipv4 get"),
+        CommandRow<IpInterfaceIpv4Set>("network ip interface ipv4 set"),
         NamespaceRow("network ip interface ipv6",
                      "Commands to get and set IPv6 settings for tslnic."),
+        CommandRow<IpInterfaceIpv6Set>("network ip interface ipv6 set"),
+        CommandRow<IpInterfaceIpv6Get>("network ip interface ipv6 get"),
         NamespaceRow("network ip interface ipv6 address",
                      "Commands to list and update IPv6 addresses assigned to the system."),
+        CommandRow<IpInterfaceIpv6AddressList>("network ip interface ipv6 address list"),
+        CommandRow<IpInterfaceIpv6AddressAdd>("network ip interface ipv6 address add"),
+        CommandRow<IpInterfaceIpv6AddressRemove>("network ip interface ipv6 address remove"),
         NamespaceRow("network ip interface tag",
                      "Commands to add and remove tags on tslnics."),
+        CommandRow<IpInterfaceTagAdd>("network ip interface tag add"),
+        CommandRow<IpInterfaceTagRemove>("network ip interface tag remove"),
+        CommandRow<IpInterfaceTagGet>("network ip interface tag get"),
         NamespaceRow("network ip netstack",
                      "Operations having to do with the creation, management and deletion of Tessel Netstack Instances."),
         NamespaceRow("network nic",
