@@ -80,6 +80,38 @@ std::string UplinkPortWithoutNic() {
     });
 }
 
+const Words kIfList = {"network", "ip", "interface", "list"};
+const Words kIfAdd = {"network", "ip", "interface", "add", "-p", "Guest Network"};
+const Words kIfAddOnDvPort = {"network", "ip", "interface", "add", "-s", "dvSwitch0", "-P", "3"};
+const Words kIfSet = {"network", "ip", "interface", "set", "-i", "tsl0", "-e", "false", "-m", "9000"};
+const Words kIpv4Set = {"network", "ip", "interface", "ipv4", "set", "-i", "tsl0", "-t", "static", "-I", "192.0.2.11", "-N", "255.255.255.0"};
+const Words kTagAdd = {"network", "ip", "interface", "tag", "add", "-i", "tsl0", "-t", "Glide"};
+
+// The netstack of live migration, in the kernel.
+std::string WithGlideNetstack() {
+    return TempHost::Edited([](TempHost::Json& d) {
+        d["netstacks"].push_back({{"key", "glide"}, {"inKernel", true}, {"maxConnections", 11000},
+                                  {"congestionControl", "newreno"}, {"ipv6Enabled", true}});
+    });
+}
+
+// tsl0 attached to DVPort 3 of dvSwitch0, or to an opaque network.
+std::string WithInterfaceOn(const TempHost::Json& point) {
+    return TempHost::Edited([&](TempHost::Json& d) {
+        d["tesselNics"][0]["connectionPoint"] = point;
+        for (auto& port : d["ports"])
+            if (port["clientName"] == "tsl0") {
+                if (point.contains("dvPort")) {
+                    port["portset"] = "dvSwitch0";
+                    port.erase("portGroup");
+                    port["dvPort"] = "3";
+                } else {
+                    port["clientName"] = "tsl9";  // a port without its interface
+                }
+            }
+    });
+}
+
 std::string UnloadedFirewall() {
     return TempHost::Edited([](TempHost::Json& d) {
         d["modules"][0]["loaded"] = false;
@@ -235,6 +267,48 @@ const std::vector<CommandRow>& CommandTable() {
         {"PortImpl::GetByteStats", kPortStats},
         {"PortImpl::GetPacketStats", kPortStats},
         {"PortImpl::GetClientType", kFilterStats},
+        {"TesselNicInfoImpl::TesselNicInfoImpl", kIfList},
+        {"TesselNicInfoImpl::GetTesselNics", kIfList},
+        {"TesselNicInfoImpl::GetTesselNicsByInstanceKey", {"network", "ip", "interface", "list", "-N", "defaultTcpipStack"}},
+        {"TesselNicInfoImpl::GetTesselNicByInterface", kIpv4Set},
+        {"TesselNicInfoImpl::AddTesselNic", kIfAdd},
+        {"TesselNicInfoImpl::RemoveTesselNic", {"network", "ip", "interface", "remove", "-p", "Host Management"}},
+        {"TesselNicInfoImpl::GetTesselNicsByTag", {"network", "ip", "interface", "add", "-p", "Guest Network", "-N", "glide"},
+         WithGlideNetstack()},
+        {"TesselNicInfoImpl::GetTesselNicNamesByInstanceKey", kTagAdd, WithGlideNetstack()},
+        {"NetworkFactory::GetNetworkInfo", kTagAdd},
+        {"NetworkInfo::GetNetstackInstanceState", kTagAdd},
+        {"PortGroupImpl::PortGroupImpl", kIfAdd},
+        {"ConnectionPoint::IsValid", kIfAdd},
+        {"ConnectionPoint::GetType", kIfList},
+        {"ConnectionPoint::GetPortsetName", kIfList},
+        {"ConnectionPoint::GetPortGroupName", kIfList},
+        {"ConnectionPoint::GetDVPortParam", kIfAddOnDvPort},
+        {"ConnectionPoint::GetOpaqueNetworkParam", kIfList,
+         WithInterfaceOn({{"opaqueNetwork", {{"networkId", "net-7"}, {"networkType", "overlay"}, {"externalId", "x"}}}})},
+        {"VirtualSwitchInfoImpl::GetDVSwitchByName", kIfList,
+         WithInterfaceOn({{"dvSwitch", "dvSwitch0"}, {"dvPort", "3"}, {"connectionId", 7}})},
+        {"DVPortImpl::GetConnectionId", kIfAddOnDvPort},
+        {"DVPortImpl::SetConnectionId", kIfAddOnDvPort},
+        {"TslNic::GetName", kIfList},
+        {"TslNic::GetMacAddress", kIfList},
+        {"TslNic::GetConnectionPoint", kIfList},
+        {"TslNic::GetNetstackInstanceKey", kIfList},
+        {"TslNic::GetMtu", kIfList},
+        {"TslNic::GetTsoMss", kIfList},
+        {"TslNic::IsEnabled", kIfList},
+        {"TslNic::GetPort", kIfList},
+        {"TslNic::Activate", kIfAdd},
+        {"TslNic::Disable", kIfSet},
+        {"TslNic::Enable", {"network", "ip", "interface", "set", "-i", "tsl0", "-e", "true"}},
+        {"TslNic::SetMtu", kIfSet},
+        {"TslNic::Remove", {"network", "ip", "interface", "remove", "-i", "tsl0"}},
+        {"TslNic::GetIpConfig", {"network", "ip", "interface", "ipv4", "get"}},
+        {"TslNic::GetConfiguredIpConfig", {"network", "ip", "interface", "ipv6", "set", "-i", "tsl0", "-r", "true"}},
+        {"TslNic::SetIpConfig", kIpv4Set},
+        {"TslNic::GetTags", {"network", "ip", "interface", "tag", "get", "-i", "tsl0"}},
+        {"TslNic::AddTag", {"network", "ip", "interface", "tag", "add", "-i", "tsl0", "-t", "Storage"}},
+        {"TslNic::RemoveTag", {"network", "ip", "interface", "tag", "remove", "-i", "tsl0", "-t", "Management"}},
     };
     return rows;
 }
