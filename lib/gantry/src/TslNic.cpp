@@ -1,4 +1,5 @@
 #include "gantry/network/ConnectionPoint.h"
+#include "gantry/network/NetstackInstance.h"
 #include "gantry/network/NetworkInfo.h"
 #include "gantry/network/Port.h"
 #include "gantry/network/TslNic.h"
@@ -7,6 +8,7 @@ namespace Gantry {
 namespace Network {
 
 ConnectionPoint::~ConnectionPoint() {}
+NetstackInstance::~NetstackInstance() {}
 NetworkInfo::~NetworkInfo() {}
 Port::~Port() {}
 TslNic::~TslNic() {}

@@ -3,6 +3,7 @@
 #include <string>
 #include <vector>
 
+#include "gantry/network/NetstackInstance.h"
 #include "gantry/network/NetworkInfo.h"
 #include "gantry/network/Pnic.h"
 #include "gantry/network/PortGroup.h"
@@ -24,6 +25,19 @@ public:
     std::vector<Gantry::Network::Pnic*> GetPnics();
     // The NIC of that name, or null.
     Gantry::Network::Pnic* GetPnicByName(std::string const& name);
+    // Stores a new instance (made on values), in the kernel unless disabled.
+    // Refuses an empty key and a key the host has.
+    void AddNetstackInstance(Gantry::Network::NetstackInstance* instance, bool disabled);
+    // Refuses an unknown key, "defaultTcpipStack", and an instance that has
+    // interfaces. The simulated host has no use for the flag.
+    void RemoveNetstackInstance(std::string const& key, bool flag);
+    // Every instance, in the order they were added.
+    std::vector<Gantry::Network::NetstackInstance*> ListNetstackInstances();
+    // The instance of that key, or null.
+    Gantry::Network::NetstackInstance* LookupNetstackInstanceByKey(std::string const& key);
+    // Whether IPv6 is on in the host's kernel.
+    bool IsTslIpv6Enabled();
+
     // Every port group of every standard switch.
     std::vector<Gantry::Network::PortGroup*> GetAllPortGroups();
 };
