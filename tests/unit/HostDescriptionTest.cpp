@@ -121,7 +121,7 @@ TEST(HostDescription, ImportReplacesTheWholeHost) {
     ArmFault({"Trellis_Exec", "", 4, {}});
     ImportHost("{\"format\": 1}");
     Json empty = Json::parse(ExportHost());
-    EXPECT_EQ(empty, Json::parse(R"({"format": 1, "modules": [],
+    EXPECT_EQ(empty, Json::parse(R"({"format": 1, "modules": [], "ipSettings": {"ipv6Enabled": true},
         "firewall": {"enabled": false, "defaultAction": "PASS", "rulesetsLoaded": false, "rulesets": [], "dynamicRules": []},
         "nics": [], "standardSwitches": [], "portGroups": [], "distributedSwitches": [], "netstacks": [], "worlds": [],
         "ports": [], "tesselNics": [],

@@ -179,7 +179,13 @@ TEST(TslNicHost, TheDescriptionRefusesInterfacesThatCannotBe) {
         std::string refusal;
     };
     const std::vector<Case> cases = {
-        {[](Json& d) { d["tesselNics"][0]["netstack"] = "glide"; }, "tesselNics[0].netstack: no netstack \"glide\""},
+        {[](Json& d) { d["tesselNics"][0]["netstack"] = "glide"; },
+         "netstacks[0].routing: no interface \"tsl0\" in \"defaultTcpipStack\""},
+        {[](Json& d) {
+             d["tesselNics"][0]["netstack"] = "glide";
+             d["netstacks"][0].erase("routing");
+         },
+         "tesselNics[0].netstack: no netstack \"glide\""},
         {[](Json& d) { d["tesselNics"][0]["name"] = "tsl256"; }, "tesselNics[0].name: expected tsl0 to tsl255"},
         {[](Json& d) { d["tesselNics"][0]["connectionPoint"] = {{"portGroup", "Guest Network"}}; },
          "tesselNics[0].connectionPoint: no port of \"tsl0\" in \"Guest Network\" (section ports)"},

@@ -4,6 +4,7 @@
 
 #include "host/DistributedMigration.h"
 #include "host/InterfaceMigration.h"
+#include "host/RoutingMigration.h"
 #include "host/Sqlite.h"
 #include "host/description/DescriptionIo.h"
 #include "trellis/host/Transaction.h"
@@ -47,6 +48,7 @@ const std::vector<Migration>& Migrations() {
         {5, "running VMs, distributed switches, and the VMs, addresses and counters of the ports in use",
          [](Transaction& t) { MigrateToDistributedSwitches(t); }},
         {6, "netstack instances and kernel interfaces", [](Transaction& t) { MigrateToKernelInterfaces(t); }},
+        {7, "the host's IPv6 switch and the routing of its netstacks", [](Transaction& t) { MigrateToRouting(t); }},
     };
     return steps;
 }

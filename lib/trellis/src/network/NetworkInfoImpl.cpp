@@ -3,7 +3,13 @@
 #include <optional>
 #include <utility>
 
+#include "RoutingStore.h"
+#include "gantry/lib/GantryException.h"
+#include "host/StoredText.h"
 #include "trellis/host/Operation.h"
+#include "trellis/host/records/IpSettingsRecord.h"
+#include "trellis/host/records/TslNicRecord.h"
+#include "trellis/network/NetstackInstanceImpl.h"
 #include "trellis/host/records/NetstackRecord.h"
 #include "trellis/host/records/PnicRecord.h"
 #include "trellis/host/records/SwitchRecords.h"
@@ -22,6 +28,11 @@ using Trellis::Host::Transaction;
 
 const Operation kConstruct("NetworkInfoImpl::NetworkInfoImpl");
 const Operation kGetNetstackInstanceState("NetworkInfo::GetNetstackInstanceState");
+const Operation kAddNetstackInstance("NetworkInfoImpl::AddNetstackInstance");
+const Operation kRemoveNetstackInstance("NetworkInfoImpl::RemoveNetstackInstance");
+const Operation kListNetstackInstances("NetworkInfoImpl::ListNetstackInstances");
+const Operation kLookupNetstackInstanceByKey("NetworkInfoImpl::LookupNetstackInstanceByKey");
+const Operation kIsTslIpv6Enabled("NetworkInfoImpl::IsTslIpv6Enabled");
 const Operation kGetPnics("NetworkInfoImpl::GetPnics");
 const Operation kGetPnicByName("NetworkInfoImpl::GetPnicByName");
 const Operation kGetAllPortGroups("NetworkInfoImpl::GetAllPortGroups");
@@ -50,6 +61,62 @@ std::vector<Gantry::Network::PortGroup*> NetworkInfoImpl::GetAllPortGroups() {
     std::vector<Gantry::Network::PortGroup*> groups;
     for (PortGroupRecord& record : records) groups.push_back(new PortGroupImpl(std::move(record)));
     return groups;
+}
+
+void NetworkInfoImpl::AddNetstackInstance(Gantry::Network::NetstackInstance* instance, bool disabled) {
+    auto* made = dynamic_cast<NetstackInstanceImpl*>(instance);
+    if (made == nullptr) throw Gantry::Lib::GantryException("Unable to add a netstack instance: none was given");
+    Trellis::Host::NetstackRecord record = made->Snapshot();
+    kAddNetstackInstance.Write([&](Transaction& t) {
+        const std::string refusal = "Unable to add netstack instance " + Trellis::Host::Printable(record.name) + ": ";
+        if (record.name.empty())
+            throw Gantry::Lib::GantryException("Unable to add a netstack instance: its key must not be empty");
+        std::string problem = Trellis::Host::TextProblem(record.name);
+        if (!problem.empty()) throw Gantry::Lib::GantryException(refusal + "its key " + problem);
+        if (t.Contains<Trellis::Host::NetstackRecord>(record.name))
+            throw Gantry::Lib::GantryException(refusal + "an instance of that key exists already");
+        record.inKernel = !disabled;
+        record.currentMaxConnections = record.maxConnections;
+        record.currentIpv6Enabled = record.ipv6Enabled;
+        record.routing = Trellis::Host::RoutingRecord();
+        t.Put(record);
+    });
+}
+
+void NetworkInfoImpl::RemoveNetstackInstance(std::string const& key, bool /*flag*/) {
+    kRemoveNetstackInstance.Write([&](Transaction& t) {
+        RoutingStore::RequireNetstack(t, key);
+        const std::string refusal = "Unable to remove netstack instance " + key + ": ";
+        if (key == Trellis::Host::NetstackRecord::kDefaultKey)
+            throw Gantry::Lib::GantryException(refusal + "it is the host's default instance");
+        std::vector<Trellis::Host::TslNicRecord> nics = t.ChildrenOf<Trellis::Host::TslNicRecord>(key);
+        if (!nics.empty())
+            throw Gantry::Lib::GantryException(refusal + "it has interfaces (" + nics.front().name +
+                                               (nics.size() > 1 ? " and " + std::to_string(nics.size() - 1) + " more" : "") + ")");
+        t.Erase<Trellis::Host::NetstackRecord>(key);
+    });
+}
+
+std::vector<Gantry::Network::NetstackInstance*> NetworkInfoImpl::ListNetstackInstances() {
+    std::vector<Trellis::Host::NetstackRecord> records =
+        kListNetstackInstances.Read([](Transaction& t) { return t.List<Trellis::Host::NetstackRecord>(); });
+    std::vector<Gantry::Network::NetstackInstance*> instances;
+    for (Trellis::Host::NetstackRecord& record : records) instances.push_back(new NetstackInstanceImpl(std::move(record)));
+    return instances;
+}
+
+Gantry::Network::NetstackInstance* NetworkInfoImpl::LookupNetstackInstanceByKey(std::string const& key) {
+    std::optional<Trellis::Host::NetstackRecord> record = kLookupNetstackInstanceByKey.Read(
+        [&](Transaction& t) { return t.Find<Trellis::Host::NetstackRecord>(key); });
+    return record ? new NetstackInstanceImpl(std::move(*record)) : nullptr;
+}
+
+bool NetworkInfoImpl::IsTslIpv6Enabled() {
+    return kIsTslIpv6Enabled.Read([](Transaction& t) {
+        return t.Find<Trellis::Host::IpSettingsRecord>(Trellis::Host::IpSettingsRecord::kName)
+            .value_or(Trellis::Host::IpSettingsRecord())
+            .ipv6Enabled;
+    });
 }
 
 int NetworkInfoImpl::GetNetstackInstanceState(std::string const& key) {

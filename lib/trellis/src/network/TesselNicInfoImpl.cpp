@@ -207,8 +207,7 @@ void TesselNicInfoImpl::RemoveTesselNic(Gantry::Network::ConnectionPoint* point,
     kRemoveTesselNic.Write([&](Transaction& t) {
         for (TslNicRecord const& nic : t.ChildrenOf<TslNicRecord>(netstackKey))
             if (SamePoint(nic.connection, connection)) {
-                if (std::optional<PortRecord> port = TslNicStore::PortOf(t, nic)) t.Erase<PortRecord>(port->name);
-                t.Erase<TslNicRecord>(nic.name);
+                TslNicStore::RemoveTslNic(t, nic);
                 return;
             }
         Refuse("Unable to remove an interface: no interface of netstack " + Trellis::Host::Printable(netstackKey) +

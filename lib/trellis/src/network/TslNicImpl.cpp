@@ -150,10 +150,7 @@ Gantry::Network::Port* TslNicImpl::GetPort() {
 
 void TslNicImpl::Remove() {
     kRemove.Write([&](Transaction& t) {
-        TslNicRecord record = TslNicStore::RequireTslNic(t, snapshot_.name);
-        if (std::optional<Trellis::Host::PortRecord> port = TslNicStore::PortOf(t, record))
-            t.Erase<Trellis::Host::PortRecord>(port->name);
-        t.Erase<TslNicRecord>(record.name);
+        TslNicStore::RemoveTslNic(t, TslNicStore::RequireTslNic(t, snapshot_.name));
     });
 }
 

@@ -6,6 +6,7 @@
 #include <cstdio>
 #include <vector>
 
+#include "RoutingStore.h"
 #include "gantry/lib/GantryException.h"
 #include "gantry/network/MacAddress.h"
 #include "host/StoredText.h"
@@ -193,6 +194,14 @@ void StoreIpConfig(Transaction& t, TslNicRecord& nic, IpConfig const& config) {
         if (port->ipv4Address == "0.0.0.0") port->ipv4Address.clear();
         t.Put(*port);
     }
+}
+
+void RemoveTslNic(Transaction& t, TslNicRecord const& nic) {
+    const auto ipv4Before = RoutingStore::Ipv4Subnets(t, nic.netstack);
+    const auto ipv6Before = RoutingStore::Ipv6Subnets(t, nic.netstack);
+    if (std::optional<PortRecord> port = PortOf(t, nic)) t.Erase<PortRecord>(port->name);
+    t.Erase<TslNicRecord>(nic.name);
+    RoutingStore::DropInterface(t, nic, ipv4Before, ipv6Before);
 }
 
 std::string PortsetOf(Transaction const& t, TslNicRecord const& nic) {

@@ -33,6 +33,10 @@ Gantry::Network::IpConfig IpConfigInForce(Trellis::Host::TslNicRecord const& nic
 void StoreIpConfig(Trellis::Host::Transaction& t, Trellis::Host::TslNicRecord& nic,
                    Gantry::Network::IpConfig const& config);
 
+// Deletes the interface, frees its port, and takes out of its netstack's
+// routing what went through it alone.
+void RemoveTslNic(Trellis::Host::Transaction& t, Trellis::Host::TslNicRecord const& nic);
+
 // The port an attached interface holds on its switch, if any.
 std::optional<Trellis::Host::PortRecord> PortOf(Trellis::Host::Transaction const& t,
                                                 Trellis::Host::TslNicRecord const& nic);

@@ -18,6 +18,7 @@ namespace Host {
 class NetstacksSection : public Section {
 public:
     void Parse(const JsonReader& value) override;
+    void CheckReferences(const ParsedDescription& description) const override;
     void Write(Transaction& t) const override;
     Json Export(const Transaction& t) const override;
 
@@ -34,6 +35,9 @@ public:
     void Write(Transaction& t) const override;
     Json Export(const Transaction& t) const override;
     void AddCopy(HostCopy& copy, Json& value) const override;
+
+    // The netstack of the interface of that name; "" when there is none.
+    std::string NetstackOf(const std::string& name) const;
 
 private:
     std::vector<TslNicRecord> nics_;

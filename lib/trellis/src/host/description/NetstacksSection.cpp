@@ -1,5 +1,7 @@
-// "netstacks": the netstack instances of the host, by key. A host has them
-// once, whatever its size: a scaled host keeps the original's.
+// "netstacks": the netstack instances of the host, by key, with their
+// routing. "defaultTcpipStack" is always there. A neighbour entry names an
+// interface of its netstack. A host has its netstacks once, whatever its
+// size: a scaled host keeps the original's, with their routing.
 
 #include <set>
 
@@ -28,6 +30,20 @@ Json NetstacksSection::Export(const Transaction& t) const {
     Json netstacks = Json::array();
     for (const NetstackRecord& netstack : t.List<NetstackRecord>()) netstacks.push_back(netstack.ToJson());
     return netstacks;
+}
+
+void NetstacksSection::CheckReferences(const ParsedDescription& description) const {
+    if (!netstacks_.empty() && !Contains(NetstackRecord::kDefaultKey))
+        throw DescriptionError(std::string("netstacks: no netstack \"") + NetstackRecord::kDefaultKey + "\"");
+    const auto& nics = description.Get<TesselNicsSection>();
+    for (std::size_t i = 0; i < netstacks_.size(); ++i) {
+        const RoutingRecord& routing = netstacks_[i].routing;
+        for (const auto* neighbors : {&routing.ipv4Neighbors, &routing.ipv6Neighbors})
+            for (const NeighborRecord& neighbor : *neighbors)
+                if (nics.NetstackOf(neighbor.interfaceName) != netstacks_[i].name)
+                    throw DescriptionError("netstacks[" + std::to_string(i) + "].routing: no interface \"" +
+                                           neighbor.interfaceName + "\" in \"" + netstacks_[i].name + "\"");
+    }
 }
 
 bool NetstacksSection::Contains(const std::string& key) const {

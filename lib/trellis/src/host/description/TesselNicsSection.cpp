@@ -98,6 +98,12 @@ void TesselNicsSection::AddCopy(HostCopy& copy, Json& value) const {
     }
 }
 
+std::string TesselNicsSection::NetstackOf(const std::string& name) const {
+    for (const TslNicRecord& nic : nics_)
+        if (nic.name == name) return nic.netstack;
+    return "";
+}
+
 namespace {
 const SectionRegistration kTesselNics("tesselNics", 85, [] { return std::make_unique<TesselNicsSection>(); });
 }  // namespace
