@@ -64,7 +64,7 @@ TEST(DistributedSwitchHost, TheDescriptionRefusesWhatCannotBe) {
          "distributedSwitches[0].lacpGroups[0].nics[0].portState: the timeout bit (2) follows shortTimeout and is "
          "not given"},
         {[](Json& d) { d["worlds"][1]["name"] = "web01"; }, "worlds[1].name: duplicate VM \"web01\""},
-        {[](Json& d) { PortWithId(d, 33554438)["worldId"] = 4242; }, "ports[3].worldId: no world 4242"},
+        {[](Json& d) { PortWithId(d, 33554438)["worldId"] = 4242; }, "ports[3].worldId: no VM's world 4242"},
         {[](Json& d) { PortWithId(d, 33554438)["clientName"] = "web01.eth7"; },
          "ports[3].clientName: expected an adapter of \"db01\" (\"db01.eth0\")"},
         {[](Json& d) { PortWithId(d, 33554438).erase("worldId"); },

@@ -3,6 +3,7 @@
 #include <string>
 #include <vector>
 
+#include "gantry/network/IpConnection.h"
 #include "gantry/network/NetstackInstance.h"
 #include "gantry/network/NetworkInfo.h"
 #include "gantry/network/Pnic.h"
@@ -35,8 +36,18 @@ public:
     std::vector<Gantry::Network::NetstackInstance*> ListNetstackInstances();
     // The instance of that key, or null.
     Gantry::Network::NetstackInstance* LookupNetstackInstanceByKey(std::string const& key);
-    // Whether IPv6 is on in the host's kernel.
+    // Whether IPv6 is on in the host's kernel; setting it takes effect after
+    // a reboot of the host, and the simulated host reflects it at once.
     bool IsTslIpv6Enabled();
+    void SetTslIpv6Enabled(bool enabled);
+    // The connections of a protocol in a netstack, appended to connections in
+    // the kernel's order; refuses an unknown netstack.
+    void GetCurrentTcpTesselConnections(std::vector<Gantry::Network::IpConnection>& connections,
+                                        std::string const& netstackKey);
+    void GetCurrentUdpTesselConnections(std::vector<Gantry::Network::IpConnection>& connections,
+                                        std::string const& netstackKey);
+    void GetCurrentIpTesselConnections(std::vector<Gantry::Network::IpConnection>& connections,
+                                       std::string const& netstackKey);
 
     // Every port group of every standard switch.
     std::vector<Gantry::Network::PortGroup*> GetAllPortGroups();

@@ -8,6 +8,7 @@
 #include <nlohmann/json.hpp>
 
 #include "host/description/InterfaceSections.h"
+#include "host/description/SwitchingSections.h"
 #include "trellis/host/Transaction.h"
 
 namespace Trellis {
@@ -36,6 +37,7 @@ void NetstacksSection::CheckReferences(const ParsedDescription& description) con
     if (!netstacks_.empty() && !Contains(NetstackRecord::kDefaultKey))
         throw DescriptionError(std::string("netstacks: no netstack \"") + NetstackRecord::kDefaultKey + "\"");
     const auto& nics = description.Get<TesselNicsSection>();
+    const auto& worlds = description.Get<WorldsSection>();
     for (std::size_t i = 0; i < netstacks_.size(); ++i) {
         const RoutingRecord& routing = netstacks_[i].routing;
         for (const auto* neighbors : {&routing.ipv4Neighbors, &routing.ipv6Neighbors})
@@ -43,6 +45,10 @@ void NetstacksSection::CheckReferences(const ParsedDescription& description) con
                 if (nics.NetstackOf(neighbor.interfaceName) != netstacks_[i].name)
                     throw DescriptionError("netstacks[" + std::to_string(i) + "].routing: no interface \"" +
                                            neighbor.interfaceName + "\" in \"" + netstacks_[i].name + "\"");
+        for (const SocketRecord& socket : netstacks_[i].connections)
+            if (worlds.Find(socket.worldId) == nullptr)
+                throw DescriptionError("netstacks[" + std::to_string(i) + "].connections: no world " +
+                                       std::to_string(socket.worldId));
     }
 }
 

@@ -75,7 +75,7 @@ void PortsSection::CheckReferences(const ParsedDescription& description) const {
         }
         if (port.clientKind == PortClientKind::VmAdapter) {
             const WorldRecord* world = worlds.Find(port.worldId);
-            if (world == nullptr) fail("worldId", "no world " + std::to_string(port.worldId));
+            if (world == nullptr || world->system) fail("worldId", "no VM's world " + std::to_string(port.worldId));
             if (port.clientName.rfind(world->vmName + ".", 0) != 0)
                 fail("clientName", "expected an adapter of \"" + world->vmName + "\" (\"" + world->vmName + ".eth0\")");
         }

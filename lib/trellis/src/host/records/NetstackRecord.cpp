@@ -1,7 +1,11 @@
 #include "trellis/host/records/NetstackRecord.h"
 
+#include <algorithm>
+#include <cctype>
+
 #include <nlohmann/json.hpp>
 
+#include "gantry/network/IpAddress.h"
 #include "gantry/network/Ipv4Address.h"
 #include "gantry/network/Ipv4Network.h"
 #include "gantry/network/Ipv6Address.h"
@@ -93,7 +97,79 @@ Json NeighborsJson(const std::vector<NeighborRecord>& neighbors, bool ipv6) {
     return list;
 }
 
+bool SameDomain(const std::string& a, const std::string& b) {
+    return a.size() == b.size() && std::equal(a.begin(), a.end(), b.begin(), [](char x, char y) {
+               return std::tolower(static_cast<unsigned char>(x)) == std::tolower(static_cast<unsigned char>(y));
+           });
+}
+
 }  // namespace
+
+bool DnsRecord::HasDomain(const std::string& domain) const {
+    return std::any_of(searchDomains.begin(), searchDomains.end(),
+                       [&](const std::string& held) { return SameDomain(held, domain); });
+}
+
+Json DnsRecord::ToJson() const { return Json{{"nameServers", nameServers}, {"searchDomains", searchDomains}}; }
+
+DnsRecord DnsRecord::FromJson(const JsonReader& in) {
+    DnsRecord dns;
+    if (!in.IsPresent()) return dns;
+    for (const JsonReader& element : in.Array("nameServers")) {
+        std::string text = element.AsString();
+        std::string server;
+        try {
+            server = Gantry::Network::IpAddress(text).GetStringAddress();
+        } catch (const std::exception&) {
+            element.Fail("expected an IP address");
+        }
+        if (std::find(dns.nameServers.begin(), dns.nameServers.end(), server) != dns.nameServers.end())
+            element.Fail("duplicate name server " + server);
+        dns.nameServers.push_back(server);
+    }
+    for (const JsonReader& element : in.Array("searchDomains")) {
+        std::string domain = element.AsString();
+        if (domain.empty() || domain.find_first_of(" \t") != std::string::npos)
+            element.Fail("expected a domain name without blanks");
+        if (dns.HasDomain(domain)) element.Fail("duplicate search domain " + domain);
+        dns.searchDomains.push_back(domain);
+    }
+    in.RejectUnknownMembers();
+    return dns;
+}
+
+Json SocketRecord::ToJson() const {
+    return Json{{"protocol", kSocketProtocolWords[protocol]},
+                {"recvQueue", recvQueue},
+                {"sendQueue", sendQueue},
+                {"localAddress", localAddress},
+                {"localPort", localPort},
+                {"foreignAddress", foreignAddress},
+                {"foreignPort", foreignPort},
+                {"state", state},
+                {"worldId", worldId},
+                {"congestionControl", congestionControl}};
+}
+
+SocketRecord SocketRecord::FromJson(const JsonReader& in) {
+    SocketRecord socket;
+    socket.protocol = WordIndex(in, "protocol", kSocketProtocolWords);
+    socket.recvQueue = static_cast<int>(in.Int("recvQueue", 0, 1 << 30));
+    socket.sendQueue = static_cast<int>(in.Int("sendQueue", 0, 1 << 30));
+    socket.localAddress = in.String("localAddress");
+    socket.localPort = static_cast<int>(in.Int("localPort", 0, 65535));
+    socket.foreignAddress = in.String("foreignAddress");
+    socket.foreignPort = static_cast<int>(in.Int("foreignPort", 0, 65535));
+    for (const char* key : {"localAddress", "foreignAddress"})
+        if (!Gantry::Network::Ipv4Address::IsValidAddress(in.String(key)) &&
+            !Gantry::Network::Ipv6Address::IsValidAddress(in.String(key)))
+            in.Member(key).Fail("expected an IP address");
+    socket.state = static_cast<int>(in.Int("state", 0, 255));
+    socket.worldId = in.Int("worldId", 0, 0xFFFFFFFFll);
+    socket.congestionControl = in.String("congestionControl", "");
+    in.RejectUnknownMembers();
+    return socket;
+}
 
 Json RoutingRecord::ToJson() const {
     Json routing = Json::object();
@@ -126,6 +202,14 @@ RoutingRecord RoutingRecord::FromJson(const JsonReader& in) {
     return routing;
 }
 
+namespace {
+Json SocketsJson(const std::vector<SocketRecord>& sockets) {
+    Json list = Json::array();
+    for (const SocketRecord& socket : sockets) list.push_back(socket.ToJson());
+    return list;
+}
+}  // namespace
+
 Json NetstackRecord::ToJson() const {
     return Json{{"key", name},
                 {"name", displayName},
@@ -135,7 +219,9 @@ Json NetstackRecord::ToJson() const {
                 {"congestionControl", congestionControl},
                 {"ipv6Enabled", ipv6Enabled},
                 {"currentIpv6Enabled", currentIpv6Enabled},
-                {"routing", routing.ToJson()}};
+                {"routing", routing.ToJson()},
+                {"dns", dns.ToJson()},
+                {"connections", SocketsJson(connections)}};
 }
 
 // The values in force may be left out: they are then those configured.
@@ -155,6 +241,8 @@ NetstackRecord NetstackRecord::FromJson(const JsonReader& in) {
     record.currentIpv6Enabled =
         in.Member("currentIpv6Enabled").IsPresent() ? in.Bool("currentIpv6Enabled") : record.ipv6Enabled;
     record.routing = RoutingRecord::FromJson(in.Member("routing"));
+    record.dns = DnsRecord::FromJson(in.Member("dns"));
+    for (const JsonReader& element : in.Array("connections")) record.connections.push_back(SocketRecord::FromJson(element));
     in.RejectUnknownMembers();
     return record;
 }

@@ -7,7 +7,11 @@
 namespace Trellis {
 namespace Host {
 
-Json WorldRecord::ToJson() const { return Json{{"id", id}, {"name", vmName}}; }
+Json WorldRecord::ToJson() const {
+    Json world{{"id", id}, {"name", vmName}};
+    if (system) world["system"] = true;
+    return world;
+}
 
 WorldRecord WorldRecord::FromJson(const JsonReader& in) {
     WorldRecord record;
@@ -15,6 +19,7 @@ WorldRecord WorldRecord::FromJson(const JsonReader& in) {
     record.name = std::to_string(record.id);
     record.vmName = in.String("name");
     if (record.vmName.empty()) in.Member("name").Fail("expected the VM's name");
+    record.system = in.Member("system").IsPresent() && in.Bool("system");
     in.RejectUnknownMembers();
     return record;
 }

@@ -1,5 +1,6 @@
 #pragma once
 
+#include <cstdint>
 #include <string>
 #include <vector>
 
@@ -46,6 +47,38 @@ struct RoutingRecord {
     static RoutingRecord FromJson(const JsonReader& in);  // absent: no routing
 };
 
+// The name servers (canonical address texts) and search domains of a
+// netstack, each in the order they are used.
+struct DnsRecord {
+    std::vector<std::string> nameServers;
+    std::vector<std::string> searchDomains;
+
+    // Whether the list has the domain, compared without regard to case.
+    bool HasDomain(const std::string& domain) const;
+    Json ToJson() const;
+    static DnsRecord FromJson(const JsonReader& in);  // absent: none
+};
+
+inline constexpr const char* kSocketProtocolWords[] = {"tcp", "udp", "ip"};
+
+// A connection of the netstack, as the kernel's tables show it; owned by a
+// world.
+struct SocketRecord {
+    int protocol = 0;  // an index into kSocketProtocolWords
+    int recvQueue = 0;
+    int sendQueue = 0;
+    std::string localAddress;
+    int localPort = 0;
+    std::string foreignAddress;
+    int foreignPort = 0;
+    int state = 0;  // TCP's state code, 0 to 10
+    std::int64_t worldId = 0;
+    std::string congestionControl;
+
+    Json ToJson() const;
+    static SocketRecord FromJson(const JsonReader& in);
+};
+
 // A netstack instance: a network stack of the kernel with its own interfaces
 // and routes ("defaultTcpipStack"). The values in force change only when the
 // instance is created in the kernel.
@@ -63,6 +96,8 @@ struct NetstackRecord {
     bool ipv6Enabled = true;
     bool currentIpv6Enabled = true;
     RoutingRecord routing;
+    DnsRecord dns;
+    std::vector<SocketRecord> connections;
 
     Json ToJson() const;  // the key as "key", the display name as "name"
     static NetstackRecord FromJson(const JsonReader& in);
