@@ -206,7 +206,8 @@ TEST(DistributedSwitchHost, AnOlderHostGetsWorldsForItsVmsAndTheDefaultDistribut
 
     host.Reopen();
     EXPECT_EQ(Section("worlds"), Json::parse(R"([{"id": 69312, "name": "web01"}, {"id": 69540, "name": "db01"},
-                                                 {"id": 69541, "name": "app07"}])"));
+        {"id": 1000, "name": "hostd", "system": true}, {"id": 1001, "name": "sshd", "system": true},
+        {"id": 1002, "name": "ntpd", "system": true}, {"id": 69541, "name": "app07"}])"));
     Json ports = Section("ports");
     EXPECT_EQ(ports[3]["worldId"], 69541);
     EXPECT_EQ(Section("distributedSwitches").size(), 2u);

@@ -49,7 +49,7 @@ TEST(HostScale, EachCopyIsTheDefaultHostRenamedWithItsReferencesWithinIt) {
     EXPECT_EQ(scaled["standardSwitches"].size(), 3u);
     EXPECT_EQ(scaled["portGroups"].size(), 6u);
     EXPECT_EQ(scaled["distributedSwitches"].size(), 6u);
-    EXPECT_EQ(scaled["worlds"].size(), 6u);
+    EXPECT_EQ(scaled["worlds"].size(), 15u);
     EXPECT_EQ(scaled["ports"].size(), 24u);
 
     // Copy 2: numbered names move past the default's, the others take a suffix.
@@ -71,7 +71,7 @@ TEST(HostScale, EachCopyIsTheDefaultHostRenamedWithItsReferencesWithinIt) {
     // A VM's adapter on a distributed switch: its switch, world, NIC and
     // address are the copy's own.
     const Json& adapterPort = scaled["ports"][23];
-    const Json& world = scaled["worlds"][4];
+    const Json& world = Named(scaled["worlds"], "web03");
     EXPECT_EQ(adapterPort["portset"], "dvSwitch4");
     EXPECT_EQ(adapterPort["clientName"], world["name"].get<std::string>() + ".eth1");
     EXPECT_EQ(adapterPort["worldId"], world["id"]);

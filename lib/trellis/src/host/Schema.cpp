@@ -4,6 +4,7 @@
 
 #include "host/DistributedMigration.h"
 #include "host/InterfaceMigration.h"
+#include "host/IpServicesMigration.h"
 #include "host/RoutingMigration.h"
 #include "host/Sqlite.h"
 #include "host/description/DescriptionIo.h"
@@ -49,6 +50,7 @@ const std::vector<Migration>& Migrations() {
          [](Transaction& t) { MigrateToDistributedSwitches(t); }},
         {6, "netstack instances and kernel interfaces", [](Transaction& t) { MigrateToKernelInterfaces(t); }},
         {7, "the host's IPv6 switch and the routing of its netstacks", [](Transaction& t) { MigrateToRouting(t); }},
+        {8, "name servers, connections, the host's own worlds and IPsec", [](Transaction& t) { MigrateToIpServices(t); }},
     };
     return steps;
 }

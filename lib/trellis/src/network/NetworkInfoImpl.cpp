@@ -33,6 +33,31 @@ const Operation kRemoveNetstackInstance("NetworkInfoImpl::RemoveNetstackInstance
 const Operation kListNetstackInstances("NetworkInfoImpl::ListNetstackInstances");
 const Operation kLookupNetstackInstanceByKey("NetworkInfoImpl::LookupNetstackInstanceByKey");
 const Operation kIsTslIpv6Enabled("NetworkInfoImpl::IsTslIpv6Enabled");
+const Operation kSetTslIpv6Enabled("NetworkInfoImpl::SetTslIpv6Enabled");
+const Operation kGetCurrentTcpTesselConnections("NetworkInfoImpl::GetCurrentTcpTesselConnections");
+const Operation kGetCurrentUdpTesselConnections("NetworkInfoImpl::GetCurrentUdpTesselConnections");
+const Operation kGetCurrentIpTesselConnections("NetworkInfoImpl::GetCurrentIpTesselConnections");
+
+void ConnectionsOf(Operation const& operation, int protocol, std::string const& key,
+                   std::vector<Gantry::Network::IpConnection>& connections) {
+    Trellis::Host::NetstackRecord netstack =
+        operation.Read([&](Transaction& t) { return RoutingStore::RequireNetstack(t, key); });
+    for (Trellis::Host::SocketRecord const& socket : netstack.connections) {
+        if (socket.protocol != protocol) continue;
+        Gantry::Network::IpConnection connection;
+        connection.protocol = Trellis::Host::kSocketProtocolWords[socket.protocol];
+        connection.recvQueue = socket.recvQueue;
+        connection.sendQueue = socket.sendQueue;
+        connection.localAddress = socket.localAddress;
+        connection.localPort = static_cast<std::uint16_t>(socket.localPort);
+        connection.foreignAddress = socket.foreignAddress;
+        connection.foreignPort = static_cast<std::uint16_t>(socket.foreignPort);
+        connection.state = socket.state;
+        connection.worldId = static_cast<std::uint32_t>(socket.worldId);
+        connection.congestionControl = socket.congestionControl;
+        connections.push_back(connection);
+    }
+}
 const Operation kGetPnics("NetworkInfoImpl::GetPnics");
 const Operation kGetPnicByName("NetworkInfoImpl::GetPnicByName");
 const Operation kGetAllPortGroups("NetworkInfoImpl::GetAllPortGroups");
@@ -117,6 +142,30 @@ bool NetworkInfoImpl::IsTslIpv6Enabled() {
             .value_or(Trellis::Host::IpSettingsRecord())
             .ipv6Enabled;
     });
+}
+
+void NetworkInfoImpl::SetTslIpv6Enabled(bool enabled) {
+    kSetTslIpv6Enabled.Write([&](Transaction& t) {
+        Trellis::Host::IpSettingsRecord settings =
+            t.Find<Trellis::Host::IpSettingsRecord>(Trellis::Host::IpSettingsRecord::kName).value_or(Trellis::Host::IpSettingsRecord());
+        settings.ipv6Enabled = enabled;
+        t.Put(settings);
+    });
+}
+
+void NetworkInfoImpl::GetCurrentTcpTesselConnections(std::vector<Gantry::Network::IpConnection>& connections,
+                                                     std::string const& netstackKey) {
+    ConnectionsOf(kGetCurrentTcpTesselConnections, 0, netstackKey, connections);
+}
+
+void NetworkInfoImpl::GetCurrentUdpTesselConnections(std::vector<Gantry::Network::IpConnection>& connections,
+                                                     std::string const& netstackKey) {
+    ConnectionsOf(kGetCurrentUdpTesselConnections, 1, netstackKey, connections);
+}
+
+void NetworkInfoImpl::GetCurrentIpTesselConnections(std::vector<Gantry::Network::IpConnection>& connections,
+                                                    std::string const& netstackKey) {
+    ConnectionsOf(kGetCurrentIpTesselConnections, 2, netstackKey, connections);
 }
 
 int NetworkInfoImpl::GetNetstackInstanceState(std::string const& key) {
