@@ -125,7 +125,7 @@ TEST(HostDescription, ImportReplacesTheWholeHost) {
         "firewall": {"enabled": false, "defaultAction": "PASS", "rulesetsLoaded": false, "rulesets": [], "dynamicRules": []},
         "nics": [], "standardSwitches": [], "portGroups": [], "distributedSwitches": [], "netstacks": [], "worlds": [],
         "ports": [], "tesselNics": [],
-        "ipsec": {"associations": [], "policies": [], "ikeConfig": {"sourcePath": "", "text": ""}},
+        "ipsec": {"associations": [], "policies": [], "ikeConfig": {"sourcePath": "", "lines": []}},
         "faults": [], "exec": []})"));
     EXPECT_TRUE(ListFaults().empty());  // the faults were replaced too, and this process knows it
 }

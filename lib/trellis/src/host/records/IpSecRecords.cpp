@@ -103,12 +103,29 @@ IpSecSpRecord IpSecSpRecord::FromJson(const JsonReader& in) {
     return sp;
 }
 
-Json IkeConfigRecord::ToJson() const { return Json{{"sourcePath", sourcePath}, {"text", text}}; }
+// The text is kept as its lines, which may hold tabs: a configuration file's
+// own characters, never shown.
+Json IkeConfigRecord::ToJson() const {
+    Json lines = Json::array();
+    std::size_t begin = 0;
+    while (begin < text.size()) {
+        std::size_t end = text.find('\n', begin);
+        if (end == std::string::npos) end = text.size();
+        lines.push_back(text.substr(begin, end - begin));
+        begin = end + 1;
+    }
+    return Json{{"sourcePath", sourcePath}, {"lines", lines}};
+}
 
 IkeConfigRecord IkeConfigRecord::FromJson(const JsonReader& in) {
     IkeConfigRecord record;
     record.sourcePath = in.String("sourcePath", "");
-    record.text = in.String("text", "");
+    for (const JsonReader& line : in.Array("lines")) {
+        if (!line.Value().is_string()) line.Fail("expected a line of text");
+        std::string text = line.Value().get<std::string>();
+        if (text.find_first_of(std::string("\n\0", 2)) != std::string::npos) line.Fail("expected one line");
+        record.text += text + "\n";
+    }
     in.RejectUnknownMembers();
     return record;
 }
