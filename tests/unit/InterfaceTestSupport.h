@@ -18,12 +18,10 @@ namespace InterfaceTest {
 using Json = nlohmann::ordered_json;
 using Errors = std::vector<std::string>;
 
-// Adds a netstack instance in the kernel, like the default one.
+// Adds a netstack instance in the kernel, without routes or connections.
 inline void AddNetstack(Json& d, const std::string& key) {
-    Json stack = d["netstacks"][0];
-    stack["key"] = key;
-    stack["name"] = key;
-    d["netstacks"].push_back(stack);
+    d["netstacks"].push_back({{"key", key}, {"inKernel", true}, {"maxConnections", 11000},
+                              {"congestionControl", "newreno"}, {"ipv6Enabled", true}});
 }
 
 // Adds tslN on the netstack with the tags, on a port of "Guest Network", or
