@@ -8,8 +8,10 @@
 namespace KorvexCli {
 namespace NetworkNamespace {
 
-// "Supported tags are: " and the names of the tags in the order of their
-// ids, separated by ", ".
+// text followed by the names of the tags in the order of their ids,
+// separated by ", ".
+std::string WithTagNames(std::string text);
+// "Supported tags are: " and the names.
 std::string SupportedTagsText();
 
 // The tag of that name, as the host matches names. An unknown name is

@@ -33,7 +33,10 @@ const char* const kTwoWays =
 }  // namespace
 
 IpInterfaceRemove::IpInterfaceRemove() {
-    SetDescription(std::string("Remove a Tessel network interface from the Halden host. ") + kTwoWays);
+    SetDescription(
+        "Remove a Tessel network interface from the Halden host. A Tessel network interface can be uniquely "
+        "specified by --interface-name or --portgroup-name or --dvs-name/--dvport-id. i.e. Providing its name or its "
+        "connection point are two ways to uniquely specify a Tessel network interface.");
     SetMetaDataField("type", "operation");
 }
 

@@ -38,7 +38,7 @@ bool DedicatedStackInUse(Trellis::Network::TesselNicInfoImpl& nicInfo, Gantry::N
 }  // namespace
 
 IpInterfaceTagAdd::IpInterfaceTagAdd() {
-    SetDescription("Adds a tag on a given Tessel network interface. " + SupportedTagsText());
+    SetDescription(WithTagNames("Adds a tag on a given Tessel network interface. Supported tags are: "));
     SetMetaDataField("type", "operation");
 }
 

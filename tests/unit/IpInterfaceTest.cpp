@@ -11,6 +11,8 @@
 #include <utility>
 #include <vector>
 
+#include <algorithm>
+
 #include <gtest/gtest.h>
 
 #include "CommandRunner.h"
@@ -124,6 +126,13 @@ TEST(IpInterfaceAdd, RefusesAConnectionPointInTheOrderOfItsChecksAndLeavesTheHos
     for (const Words& words : {Words{"-p", "Guest Network", "-i", "tsl256"}, Words{"-p", "Guest Network", "-m", "1279"},
                                Words{"-p", "Guest Network", "-m", "9001"}})
         EXPECT_THROW(RunCommand<IpInterfaceAdd>(words), Plinth::Cli::UsageError);
+    // The name's pattern as the reference tables write it, their "\|" escapes for "|" aside.
+    std::string documented = "tsl([0-9]\\|[1-9][0-9]\\|1[0-9][0-9]\\|2[0-4][0-9]\\|25[0-5])";
+    documented.erase(std::remove(documented.begin(), documented.end(), '\\'), documented.end());
+    const auto spec = IpInterfaceAdd::New()->GetInputSpec();
+    for (const auto& parameter : spec->GetParameters())
+        if (parameter->GetName() == "interface-name")
+            EXPECT_EQ(parameter->GetConstraint()->GetStringRegex(), documented);
     EXPECT_EQ(ExportHost(), before);
     // The port has a connection before the host refuses it, and keeps it.
     ExpectFailure(RunCommand<IpInterfaceAdd>({"-s", "dvSwitch0", "-P", "0"}),
