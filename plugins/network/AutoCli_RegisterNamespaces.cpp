@@ -25,6 +25,11 @@
 #include "IpInterfaceTagAdd.h"
 #include "IpInterfaceTagGet.h"
 #include "IpInterfaceTagRemove.h"
+#include "IpNetstackInstanceAdd.h"
+#include "IpNetstackInstanceGet.h"
+#include "IpNetstackInstanceList.h"
+#include "IpNetstackInstanceRemove.h"
+#include "IpNetstackInstanceSet.h"
 #include "LacpGetConfig.h"
 #include "LacpGetStats.h"
 #include "LacpGetStatus.h"
@@ -120,6 +125,11 @@ std::vector<TreeRow> NetworkTree() {
         CommandRow<IpInterfaceTagGet>("network ip interface tag get"),
         NamespaceRow("network ip netstack",
                      "Operations having to do with the creation, management and deletion of Tessel Netstack Instances."),
+        CommandRow<IpNetstackInstanceList>("network ip netstack list"),
+        CommandRow<IpNetstackInstanceAdd>("network ip netstack add"),
+        CommandRow<IpNetstackInstanceRemove>("network ip netstack remove"),
+        CommandRow<IpNetstackInstanceGet>("network ip netstack get"),
+        CommandRow<IpNetstackInstanceSet>("network ip netstack set"),
         NamespaceRow("network nic",
                      "Operations having to do with the configuration of Network Interface Card and getting and updating the NIC settings."),
         NamespaceRow("network nic stats",
