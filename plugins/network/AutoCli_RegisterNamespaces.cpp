@@ -30,6 +30,12 @@
 #include "IpNetstackInstanceList.h"
 #include "IpNetstackInstanceRemove.h"
 #include "IpNetstackInstanceSet.h"
+#include "IpRouteIpv4Add.h"
+#include "IpRouteIpv4List.h"
+#include "IpRouteIpv4Remove.h"
+#include "IpRouteIpv6Add.h"
+#include "IpRouteIpv6List.h"
+#include "IpRouteIpv6Remove.h"
 #include "LacpGetConfig.h"
 #include "LacpGetStats.h"
 #include "LacpGetStatus.h"
@@ -91,8 +97,14 @@ std::vector<TreeRow> NetworkTree() {
                      "Operations pertaining to route configuration"),
         NamespaceRow("network ip route ipv4",
                      "IPv4 route operations"),
+        CommandRow<IpRouteIpv4Add>("network ip route ipv4 add"),
+        CommandRow<IpRouteIpv4Remove>("network ip route ipv4 remove"),
+        CommandRow<IpRouteIpv4List>("network ip route ipv4 list"),
         NamespaceRow("network ip route ipv6",
                      "IPv6 route operations"),
+        CommandRow<IpRouteIpv6Add>("network ip route ipv6 add"),
+        CommandRow<IpRouteIpv6Remove>("network ip route ipv6 remove"),
+        CommandRow<IpRouteIpv6List>("network ip route ipv6 list"),
         NamespaceRow("network ip ipsec",
                      "Operations on Internet Protocol Security"),
         NamespaceRow("network ip ipsec sa",
