@@ -25,6 +25,8 @@
 #include "IpInterfaceTagAdd.h"
 #include "IpInterfaceTagGet.h"
 #include "IpInterfaceTagRemove.h"
+#include "IpNeighborList.h"
+#include "IpNeighborRemove.h"
 #include "IpNetstackInstanceAdd.h"
 #include "IpNetstackInstanceGet.h"
 #include "IpNetstackInstanceList.h"
@@ -85,6 +87,8 @@ std::vector<TreeRow> NetworkTree() {
                      "Operations that can be performed on tslnics"),
         NamespaceRow("network ip neighbor",
                      "Operations that can be performed on arp tables"),
+        CommandRow<IpNeighborList>("network ip neighbor list"),
+        CommandRow<IpNeighborRemove>("network ip neighbor remove"),
         NamespaceRow("network ip connection",
                      "List active tcpip connections"),
         NamespaceRow("network ip dns",
