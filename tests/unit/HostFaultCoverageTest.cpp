@@ -86,6 +86,12 @@ const Words kIfAddOnDvPort = {"network", "ip", "interface", "add", "-s", "dvSwit
 const Words kIfSet = {"network", "ip", "interface", "set", "-i", "tsl0", "-e", "false", "-m", "9000"};
 const Words kIpv4Set = {"network", "ip", "interface", "ipv4", "set", "-i", "tsl0", "-t", "static", "-I", "192.0.2.11", "-N", "255.255.255.0"};
 const Words kTagAdd = {"network", "ip", "interface", "tag", "add", "-i", "tsl0", "-t", "Glide"};
+const Words kNetstackGet = {"network", "ip", "netstack", "get", "-N", "defaultTcpipStack"};
+const Words kNetstackSet = {"network", "ip", "netstack", "set", "-N", "defaultTcpipStack", "-n", "Main", "-e", "true", "-m", "500", "-c", "cubic", "-i", "true"};
+const Words kRoute4List = {"network", "ip", "route", "ipv4", "list"};
+const Words kRoute4RemoveDefault = {"network", "ip", "route", "ipv4", "remove", "-n", "default", "-g", "192.0.2.1"};
+const Words kRoute6RemoveDefault = {"network", "ip", "route", "ipv6", "remove", "-n", "default", "-g", "2001:db8::1"};
+const Words kNeighborList = {"network", "ip", "neighbor", "list"};
 
 // The netstack of live migration, in the kernel.
 std::string WithGlideNetstack() {
@@ -309,6 +315,47 @@ const std::vector<CommandRow>& CommandTable() {
         {"TslNic::GetTags", {"network", "ip", "interface", "tag", "get", "-i", "tsl0"}},
         {"TslNic::AddTag", {"network", "ip", "interface", "tag", "add", "-i", "tsl0", "-t", "Storage"}},
         {"TslNic::RemoveTag", {"network", "ip", "interface", "tag", "remove", "-i", "tsl0", "-t", "Management"}},
+        {"NetstackInstanceImpl::GetCongestionControlAlgorithmList", kNetstackSet},
+        {"NetworkInfoImpl::AddNetstackInstance", {"network", "ip", "netstack", "add", "-N", "backupStack"}},
+        {"NetworkInfoImpl::RemoveNetstackInstance", {"network", "ip", "netstack", "remove", "-N", "glide"},
+         WithGlideNetstack()},
+        {"NetworkInfoImpl::ListNetstackInstances", {"network", "ip", "netstack", "list"}},
+        {"NetworkInfoImpl::LookupNetstackInstanceByKey", kNetstackGet},
+        {"NetworkInfoImpl::IsTslIpv6Enabled", kNeighborList},
+        {"NetstackInstance::GetKey", kNetstackGet},
+        {"NetstackInstance::GetName", kNetstackGet},
+        {"NetstackInstance::GetMaxConnections", kNetstackGet},
+        {"NetstackInstance::GetCurrentMaxConnections", kNetstackGet},
+        {"NetstackInstance::GetCongestionControlAlgorithm", kNetstackGet},
+        {"NetstackInstance::GetIpv6Enabled", kNetstackGet},
+        {"NetstackInstance::GetCurrentIpv6Enabled", kNetstackGet},
+        {"NetstackInstance::GetState", kNetstackGet},
+        {"NetstackInstance::SetName", kNetstackSet},
+        {"NetstackInstance::Enable", kNetstackSet},
+        {"NetstackInstance::Disable", {"network", "ip", "netstack", "set", "-N", "defaultTcpipStack", "-e", "false"}},
+        {"NetstackInstance::SetMaxConnections", kNetstackSet},
+        {"NetstackInstance::SetCongestionControlAlgorithm", kNetstackSet},
+        {"NetstackInstance::SetIpv6Enabled", kNetstackSet},
+        {"RoutingInfoImpl::AddTesselRoute", {"network", "ip", "route", "ipv4", "add", "-n", "203.0.113.0/24", "-g", "192.0.2.254"}},
+        {"RoutingInfoImpl::RemoveTesselRoute", {"network", "ip", "route", "ipv4", "remove", "-n", "198.51.100.0/24", "-g", "192.0.2.254"}},
+        {"RoutingInfoImpl::AddIpv6TesselRoute", {"network", "ip", "route", "ipv6", "add", "-n", "2001:db8:5::/48", "-g", "2001:db8::fe"}},
+        {"RoutingInfoImpl::RemoveIpv6TesselRoute", {"network", "ip", "route", "ipv6", "remove", "-n", "2001:db8:5::/48", "-g", "2001:db8::fe"}},
+        {"RoutingInfoImpl::GetCurrentTesselRoutes", kRoute4List},
+        {"RoutingInfoImpl::GetDefaultGatewaySource", kRoute4List},
+        {"RoutingInfoImpl::GetCurrentIpv6TesselRoutes", {"network", "ip", "route", "ipv6", "list"}},
+        {"RoutingInfoImpl::GetTesselDefaultGateway", kRoute4RemoveDefault},
+        {"RoutingInfoImpl::GetTesselConfigDefaultGateway", {"network", "ip", "route", "ipv4", "remove", "-n", "default", "-g", "192.0.2.99"}},
+        {"RoutingInfoImpl::SetTesselDefaultGateway", kRoute4RemoveDefault},
+        {"RoutingInfoImpl::GetIpv6TesselDefaultGateway", kRoute6RemoveDefault},
+        {"RoutingInfoImpl::GetIpv6TesselConfigDefaultGateway", {"network", "ip", "route", "ipv6", "remove", "-n", "default", "-g", "2001:db8::99"}},
+        {"RoutingInfoImpl::SetIpv6TesselDefaultGateway", kRoute6RemoveDefault},
+        {"RoutingInfoImpl::GetCurrentIpv4TesselNeighbors", kNeighborList},
+        {"RoutingInfoImpl::GetCurrentIpv6TesselNeighbors", kNeighborList},
+        {"RoutingInfoImpl::GetIpv4NeighborType", kNeighborList},
+        {"RoutingInfoImpl::GetIpv6NeighborType", kNeighborList},
+        {"RoutingInfoImpl::GetIpv6NeighborState", kNeighborList},
+        {"RoutingInfoImpl::RemoveIpv4Neighbor", {"network", "ip", "neighbor", "remove", "-v", "4", "-a", "192.0.2.1"}},
+        {"RoutingInfoImpl::RemoveIpv6Neighbor", {"network", "ip", "neighbor", "remove", "-v", "6", "-a", "2001:db8::1"}},
     };
     return rows;
 }
