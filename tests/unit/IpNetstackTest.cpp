@@ -24,7 +24,6 @@
 using namespace KorvexCli::NetworkNamespace;
 using namespace RoutingTest;
 using Trellis::Host::ArmFault;
-using Errors = std::vector<std::string>;
 
 namespace {
 
@@ -41,8 +40,7 @@ Json Got() { return Get().Parsed().at(0); }
 TEST(IpNetstackInstance, ADisabledInstanceIsCreatedBeforeSetStoresItsNewLimit) {
     TempHost host;
     CommandRun run = RunCommand<IpNetstackInstanceAdd>({"-N", "backupStack", "--disabled"});
-    EXPECT_EQ(run.errors, Errors{});
-    EXPECT_EQ(run.Json(), "true");
+    ExpectDone(run);
     EXPECT_EQ(RunCommand<IpNetstackInstanceGet>({"--netstack", "backupStack"}).Json(),
               R"([{"Key":"backupStack","Name":"backupStack","Enabled":false,"Max Connections":11000,)"
               R"("Current Max Connections":11000,"Congestion Control Algorithm":"newreno","IPv6 Enabled":true,)"
@@ -71,8 +69,7 @@ TEST(IpNetstackInstance, ListsInTheOrderAddedAndRemoves) {
     EXPECT_EQ(Netstack("backupStack"), nullptr);
     for (const CommandRun& run : {RunCommand<IpNetstackInstanceGet>({"-N", "nope"}),
                                   RunCommand<IpNetstackInstanceSet>({"-N", "nope", "-n", "Nope"})}) {
-        EXPECT_EQ(run.errors, Errors{"Unable to find a Netstack instance nope"});
-        EXPECT_FALSE(run.HasResult());
+        ExpectFailure(run, "Unable to find a Netstack instance nope");
     }
 }
 
@@ -114,8 +111,7 @@ TEST(IpNetstackInstance, EachCommandReportsAHostFailureInItsOwnWords) {
         SCOPED_TRACE(c.operation);
         ArmFault({c.operation, "stack busy", 0, 1});
         CommandRun run = c.run();
-        EXPECT_EQ(run.errors, Errors{c.text});
-        EXPECT_FALSE(run.HasResult());
+        ExpectFailure(run, c.text);
     }
     // What set changed before its failure stays; what comes after is not done.
     EXPECT_EQ(Got()["Name"], "Backup");

@@ -26,7 +26,6 @@
 using namespace KorvexCli::NetworkNamespace;
 using namespace RoutingTest;
 using Trellis::Host::ArmFault;
-using Errors = std::vector<std::string>;
 
 namespace {
 
@@ -63,8 +62,7 @@ TEST(IpRouteIpv4, ListsTheNetstackChosenAndAddsAndRemovesRoutesAndTheDefaultGate
     EXPECT_EQ(Column(RunCommand<IpRouteIpv4List>({"-N", "backupStack"}), "Source"), (Errors{"MANUAL", "DHCP"}));
 
     CommandRun run = RunCommand<IpRouteIpv4Add>({"-n", "203.0.113.0/24", "-g", "198.51.100.254", "-N", "backupStack"});
-    EXPECT_EQ(run.errors, Errors{});
-    EXPECT_EQ(run.Json(), "true");
+    ExpectDone(run);
     EXPECT_EQ(Routing("backupStack")["ipv4Routes"],
               Json::parse(R"([{"network":"203.0.113.0/24","gateway":"198.51.100.254"}])"));
     EXPECT_EQ(RunCommand<IpRouteIpv4Remove>({"-n", "203.0.113.0/24", "-g", "198.51.100.254", "-N", "backupStack"})
@@ -88,9 +86,7 @@ TEST(IpRouteRemove, TheDefaultRouteGoesByTheGatewayInForceOrConfiguredAndAWrongO
     run = RunCommand<IpRouteIpv6Remove>({"-n", "default", "-g", "2001:db8::1"});
     EXPECT_EQ(run.errors, Errors{"2001:db8::1 is not a default route."});
     EXPECT_EQ(run.Json(), "true");
-    run = RunCommand<IpRouteIpv4Remove>({"-n", "Default", "-g", "192.0.2.1"});
-    EXPECT_EQ(run.errors, Errors{"Invalid IPv4 network: Default"});
-    EXPECT_FALSE(run.HasResult());
+    ExpectFailure(RunCommand<IpRouteIpv4Remove>({"-n", "Default", "-g", "192.0.2.1"}), "Invalid IPv4 network: Default");
     EXPECT_EQ(Trellis::Host::ExportHost(), before);
 
     EXPECT_EQ(RunCommand<IpRouteIpv4Remove>({"-n", "default", "-g", "192.0.2.1"}).errors, Errors{});
@@ -139,8 +135,7 @@ TEST(IpRoute, EachCommandReportsTheHostsTextAlone) {
         SCOPED_TRACE(c.operation);
         ArmFault({c.operation, "routing table busy", 0, 1});
         CommandRun run = c.run();
-        EXPECT_EQ(run.errors, Errors{"routing table busy"});
-        EXPECT_FALSE(run.HasResult());
+        ExpectFailure(run, "routing table busy");
     }
     EXPECT_EQ(Trellis::Host::ExportHost(), before);
     // The gateway in force matches: the configured one is not read.
@@ -164,8 +159,7 @@ TEST(IpNeighborList, ListsBothTablesByVersionAndFiltersTheNetstacksTableByInterf
     // tsl1 exists, so the default netstack's table is read for it: empty.
     EXPECT_EQ(RunCommand<IpNeighborList>({"-i", "tsl1"}).Json(), "[]");
     run = RunCommand<IpNeighborList>({"-i", "tsl9"});
-    EXPECT_EQ(run.errors, Errors{"Unable to find a Tessel interface with the name tsl9"});
-    EXPECT_FALSE(run.HasResult());
+    ExpectFailure(run, "Unable to find a Tessel interface with the name tsl9");
 }
 
 TEST(IpNeighborRemove, RemovesFromTheNetstackChosenOrFromTheInterfacesOwn) {
@@ -179,8 +173,7 @@ TEST(IpNeighborRemove, RemovesFromTheNetstackChosenOrFromTheInterfacesOwn) {
     EXPECT_EQ(Routing("backupStack")["ipv4Neighbors"], Json::array());
     EXPECT_EQ(Routing("backupStack")["ipv6Neighbors"], Json::array());
     CommandRun run = RunCommand<IpNeighborRemove>({"-v", "6", "-a", "2001:db8::1", "-i", "tsl1"});
-    EXPECT_EQ(run.errors, Errors{"Netstack instance backupStack has no neighbour entry for 2001:db8::1 on tsl1"});
-    EXPECT_FALSE(run.HasResult());
+    ExpectFailure(run, "Netstack instance backupStack has no neighbour entry for 2001:db8::1 on tsl1");
 }
 
 TEST(IpNeighbor, WithIpv6OffInTheKernelOnlyTheIpv4TableIsListedOrChanged) {
