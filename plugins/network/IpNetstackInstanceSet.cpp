@@ -23,7 +23,7 @@ const Parameter kName = Parameter::String("name", "n", "The name for this netsta
 const Parameter kMaxConn = Parameter::Int(
     "maxconn", "m",
     "The maximum number of connections for this netstack instance (applied only during netstack creation).");
-// Its choices are the host's algorithms, asked for with each specification.
+// Its choices are the host's algorithms, asked for each time the options are read.
 const Parameter kCcAlgo = Parameter::String(
     "ccalgo", "c",
     "The TCP Congestion Contol Algorithm for this netstack instance (not applied to existing connections).: "
