@@ -11,6 +11,14 @@
 #include "FirewallRulesetSet.h"
 #include "FirewallSet.h"
 #include "FirewallUnload.h"
+#include "IpConnectionList.h"
+#include "IpDNSSearchAdd.h"
+#include "IpDNSSearchList.h"
+#include "IpDNSSearchRemove.h"
+#include "IpDNSServerAdd.h"
+#include "IpDNSServerList.h"
+#include "IpDNSServerRemove.h"
+#include "IpGet.h"
 #include "IpInterfaceAdd.h"
 #include "IpInterfaceIpv4Get.h"
 #include "IpInterfaceIpv4Set.h"
@@ -25,6 +33,13 @@
 #include "IpInterfaceTagAdd.h"
 #include "IpInterfaceTagGet.h"
 #include "IpInterfaceTagRemove.h"
+#include "IpIpsecSAAdd.h"
+#include "IpIpsecSAList.h"
+#include "IpIpsecSARemove.h"
+#include "IpIpsecSPAdd.h"
+#include "IpIpsecSPList.h"
+#include "IpIpsecSPRemove.h"
+#include "IpIpsecSet.h"
 #include "IpNeighborList.h"
 #include "IpNeighborRemove.h"
 #include "IpNetstackInstanceAdd.h"
@@ -38,6 +53,7 @@
 #include "IpRouteIpv6Add.h"
 #include "IpRouteIpv6List.h"
 #include "IpRouteIpv6Remove.h"
+#include "IpSet.h"
 #include "LacpGetConfig.h"
 #include "LacpGetStats.h"
 #include "LacpGetStatus.h"
@@ -85,18 +101,27 @@ std::vector<TreeRow> NetworkTree() {
                      "Operations that pertain to the maintenance of networking on an Halden host. This includes a wide variety of commands to manipulate virtual networking components (vswitch, portgroup, etc) as well as local host IP, DNS and general host networking settings."),
         NamespaceRow("network ip",
                      "Operations that can be performed on tslnics"),
+        CommandRow<IpGet>("network ip get"),
+        CommandRow<IpSet>("network ip set"),
         NamespaceRow("network ip neighbor",
                      "Operations that can be performed on arp tables"),
         CommandRow<IpNeighborList>("network ip neighbor list"),
         CommandRow<IpNeighborRemove>("network ip neighbor remove"),
         NamespaceRow("network ip connection",
                      "List active tcpip connections"),
+        CommandRow<IpConnectionList>("network ip connection list"),
         NamespaceRow("network ip dns",
                      "Operations pertaining to Domain Name Server configuration."),
         NamespaceRow("network ip dns server",
                      "Operations pertaining to DNS server configuration."),
+        CommandRow<IpDNSServerList>("network ip dns server list"),
+        CommandRow<IpDNSServerAdd>("network ip dns server add"),
+        CommandRow<IpDNSServerRemove>("network ip dns server remove"),
         NamespaceRow("network ip dns search",
                      "Operations pertaining to DNS search domain configuration."),
+        CommandRow<IpDNSSearchAdd>("network ip dns search add"),
+        CommandRow<IpDNSSearchRemove>("network ip dns search remove"),
+        CommandRow<IpDNSSearchList>("network ip dns search list"),
         NamespaceRow("network ip route",
                      "Operations pertaining to route configuration"),
         NamespaceRow("network ip route ipv4",
@@ -111,10 +136,17 @@ std::vector<TreeRow> NetworkTree() {
         CommandRow<IpRouteIpv6List>("network ip route ipv6 list"),
         NamespaceRow("network ip ipsec",
                      "Operations on Internet Protocol Security"),
+        CommandRow<IpIpsecSet>("network ip ipsec set"),
         NamespaceRow("network ip ipsec sa",
                      "Operations pertaining to Security Association"),
+        CommandRow<IpIpsecSAAdd>("network ip ipsec sa add"),
+        CommandRow<IpIpsecSARemove>("network ip ipsec sa remove"),
+        CommandRow<IpIpsecSAList>("network ip ipsec sa list"),
         NamespaceRow("network ip ipsec sp",
                      "Operations pertaining to Security Policy"),
+        CommandRow<IpIpsecSPAdd>("network ip ipsec sp add"),
+        CommandRow<IpIpsecSPRemove>("network ip ipsec sp remove"),
+        CommandRow<IpIpsecSPList>("network ip ipsec sp list"),
         NamespaceRow("network ip interface",
                      "Operations having to do with the creation, management and deletion of Tessel network interfaces (tslnic)."),
         CommandRow<IpInterfaceAdd>("network ip interface add"),
