@@ -4,6 +4,7 @@
 // operation that no built command reaches yet is called directly instead.
 // A new host operation must join one of the two tables, or this test fails.
 
+#include <fstream>
 #include <functional>
 #include <map>
 #include <memory>
@@ -20,6 +21,7 @@
 #include "plinth/cli/Tool.h"
 #include "trellis/host/Faults.h"
 #include "trellis/host/Operation.h"
+#include "trellis/network/DnsConfigImpl.h"
 #include "trellis/network/NetworkInfoImpl.h"
 #include "trellis/network/PnicImpl.h"
 #include "trellis/network/PortImpl.h"
@@ -116,6 +118,24 @@ std::string WithInterfaceOn(const TempHost::Json& point) {
                 }
             }
     });
+}
+
+const Words kDnsServerAdd = {"network", "ip", "dns", "server", "add", "-s", "192.0.2.1"};
+const Words kDnsServerList = {"network", "ip", "dns", "server", "list"};
+const Words kConnectionList = {"network", "ip", "connection", "list"};
+const Words kSaAdd = {"network", "ip", "ipsec", "sa", "add", "-n", "sa-new", "-s", "any", "-d", "any", "-p", "99",
+                      "-e", "null", "-i", "hmac-sha1", "-K", "0123456789abcdef0123"};
+const Words kSpAdd = {"network", "ip", "ipsec", "sp", "add", "-n", "sp-new", "-s", "any", "-d", "any", "-p", "0",
+                      "-P", "0", "-A", "ipsec", "-a", "sa-web", "-m", "transport", "-u", "tcp", "-w", "in"};
+
+// A key exchange configuration the host accepts, for the steps behind its check.
+Words IpsecSetOfAGoodFile() {
+    static const std::string path = [] {
+        std::string file = ::testing::TempDir() + "halden-fault-coverage-ike.conf";
+        std::ofstream(file) << "[global]\nlog = info\n";
+        return file;
+    }();
+    return {"network", "ip", "ipsec", "set", "-f", path};
 }
 
 std::string UnloadedFirewall() {
@@ -356,6 +376,40 @@ const std::vector<CommandRow>& CommandTable() {
         {"RoutingInfoImpl::GetIpv6NeighborState", kNeighborList},
         {"RoutingInfoImpl::RemoveIpv4Neighbor", {"network", "ip", "neighbor", "remove", "-v", "4", "-a", "192.0.2.1"}},
         {"RoutingInfoImpl::RemoveIpv6Neighbor", {"network", "ip", "neighbor", "remove", "-v", "6", "-a", "2001:db8::1"}},
+        {"NetworkInfoImpl::SetTslIpv6Enabled", {"network", "ip", "set", "-e", "false"}},
+        {"NetworkInfoImpl::GetCurrentTcpTesselConnections", kConnectionList},
+        {"NetworkInfoImpl::GetCurrentUdpTesselConnections", kConnectionList},
+        {"NetworkInfoImpl::GetCurrentIpTesselConnections", kConnectionList},
+        {"ResourceInfoImpl::ResourceInfoImpl", kConnectionList},
+        {"ResourceInfoImpl::GetWorldName", kConnectionList},
+        {"DnsConfigImpl::DnsConfigImpl", kDnsServerList},
+        {"DnsConfigImpl::GetNameServers", kDnsServerList},
+        {"DnsConfigImpl::AddNameServer", kDnsServerAdd},
+        {"DnsConfigImpl::SaveConfig", kDnsServerAdd},
+        {"DnsConfigImpl::RemoveNameServer", {"network", "ip", "dns", "server", "remove", "-s", "192.0.2.53"}},
+        {"DnsConfigImpl::GetSearchDomainsString", {"network", "ip", "dns", "search", "list"}},
+        {"DnsConfigImpl::AddSearchDomain", {"network", "ip", "dns", "search", "add", "-d", "x.example"}},
+        {"DnsConfigImpl::RemoveSearchDomain", {"network", "ip", "dns", "search", "remove", "-d", "example.com"}},
+        {"IpSecConfigImpl::IpSecConfigImpl", {"network", "ip", "ipsec", "sa", "list"}},
+        {"IpSecConfigImpl::GetSADConfigList", {"network", "ip", "ipsec", "sa", "list"}},
+        {"IpSecConfigImpl::StringToIpSecMode", kSaAdd},
+        {"IpSecConfigImpl::StringToIpSecEncyptAlgo", kSaAdd},
+        {"IpSecConfigImpl::StringToIpSecAuthAlgo", kSaAdd},
+        {"IpSecConfigImpl::AddSADConfig", kSaAdd},
+        {"IpSecConfigImpl::RemoveSADConfig", {"network", "ip", "ipsec", "sa", "remove", "-n", "sa-web"}},
+        {"IpSecConfigImpl::RemoveAutoSADConfig",
+         {"network", "ip", "ipsec", "sa", "remove", "-n", "auto", "-s", "2001:db8::21", "-d", "2001:db8::10", "-p", "c0de"}},
+        {"IpSecConfigImpl::FlushSADConfig", {"network", "ip", "ipsec", "sa", "remove", "-a"}},
+        {"IpSecConfigImpl::StringToIpSecULProtoType", kSpAdd},
+        {"IpSecConfigImpl::StringToIpSecDirection", kSpAdd},
+        {"IpSecConfigImpl::StringToIpSecAction", kSpAdd},
+        {"IpSecConfigImpl::AddSPDConfig", kSpAdd},
+        {"IpSecConfigImpl::GetSPDConfigList", {"network", "ip", "ipsec", "sp", "list"}},
+        {"IpSecConfigImpl::RemoveSPDConfig", {"network", "ip", "ipsec", "sp", "remove", "-n", "sp-drop"}},
+        {"IpSecConfigImpl::FlushSPDConfig", {"network", "ip", "ipsec", "sp", "remove", "-a"}},
+        {"IpSecConfigImpl::CheckIKEConfig", {"network", "ip", "ipsec", "set", "-f", "/nonexistent/ike.conf"}},
+        {"IpSecConfigImpl::CopyIKEConfig", IpsecSetOfAGoodFile()},
+        {"IpSecConfigImpl::RestartIKEDaemons", IpsecSetOfAGoodFile()},
     };
     return rows;
 }
@@ -372,13 +426,18 @@ const std::vector<DirectRow>& DirectTable() {
         {"NetworkInfoImpl::GetPnicByName", Thrown([] {
              std::unique_ptr<Gantry::Network::Pnic>(Trellis::Network::NetworkInfoImpl().GetPnicByName("pnet0"));
          })},
+        // dns server remove declares --server required, so the tool refuses --all
+        // alone, which is the only way to this operation.
+        {"DnsConfigImpl::RemoveNameServers",
+         Thrown([] { Trellis::Network::DnsConfigImpl("defaultTcpipStack").RemoveNameServers(); })},
+        // ipsec set reaches it, but reports the status in the host's words
+        // ("... returned 77"), which IpIpsecTest checks.
+        {"Trellis_Exec",
+         [] { return "status " + std::to_string(Trellis::Util::Trellis_Exec("true", false, true, false)); }},
         // vm port list reports this failure as an uplink port id of 0.
         {"PnicImpl::GetUplinkPort", Thrown([] {
              std::unique_ptr<Trellis::Network::PortImpl>(Trellis::Network::PnicImpl("pnet0").GetUplinkPort());
          })},
-        // No command runs a shell command line yet.
-        {"Trellis_Exec",
-         [] { return "status " + std::to_string(Trellis::Util::Trellis_Exec("true", false, true, false)); }},
     };
     return rows;
 }
