@@ -98,7 +98,7 @@ std::vector<std::string> Column(const Json& rows, const std::string& title) {
 
 }  // namespace
 
-TEST(IpDNSServer, ServersOfEitherFamilyAreAddedAtTheEndAndRemovedOneOrAll) {
+TEST(IpDnsServer, ServersOfEitherFamilyAreAddedAtTheEndAndRemovedOneOrAll) {
     TempHost host;
     EXPECT_EQ(Servers(), Json({"192.0.2.53", "2001:db8::53"}));
     ExpectDone(RunCommand<IpDNSServerAdd>({"--server", "203.0.113.53"}));
@@ -112,7 +112,7 @@ TEST(IpDNSServer, ServersOfEitherFamilyAreAddedAtTheEndAndRemovedOneOrAll) {
     EXPECT_EQ(RunCommand<IpDNSServerList>().Json(), R"({"DNS Servers":[]})");
 }
 
-TEST(IpDNSServer, AnAddressNeitherFamilyAcceptsIsRefusedBeforeTheHost) {
+TEST(IpDnsServer, AnAddressNeitherFamilyAcceptsIsRefusedBeforeTheHost) {
     TempHost host;
     for (const char* text : {"192.0.2", "2001:db8::53/64", "dns.example.com", " 192.0.2.1"}) {
         SCOPED_TRACE(text);
@@ -124,7 +124,7 @@ TEST(IpDNSServer, AnAddressNeitherFamilyAcceptsIsRefusedBeforeTheHost) {
     EXPECT_EQ(Servers(), Json({"192.0.2.53", "2001:db8::53"}));
 }
 
-TEST(IpDNSServerRemove, TakesExactlyOneOfAllAndServer) {
+TEST(IpDnsServerRemove, TakesExactlyOneOfAllAndServer) {
     TempHost host;
     const std::string text = "You must specify exactly one of: --all, --server";
     ExpectFailure(RunCommand<IpDNSServerRemove>({"--all", "--server", "192.0.2.53"}), text);
@@ -134,7 +134,7 @@ TEST(IpDNSServerRemove, TakesExactlyOneOfAllAndServer) {
     EXPECT_EQ(Servers(), Json({"192.0.2.53", "2001:db8::53"}));
 }
 
-TEST(IpDNSSearch, DomainsAreAddedAtTheEndAndRemovedByName) {
+TEST(IpDnsSearch, DomainsAreAddedAtTheEndAndRemovedByName) {
     TempHost host;
     EXPECT_EQ(Domains(), Json({"example.com", "lab.example.net"}));
     ExpectDone(RunCommand<IpDNSSearchAdd>({"--domain", "corp.example.org"}));
@@ -212,7 +212,7 @@ TEST(IpDns, AHostFailureOfAnEditGivesItsTextAndTrueAndChangesNothing) {
     ExpectFailure(RunCommand<IpDNSSearchList>(), "busy");
 }
 
-TEST(IpGetSet, TheIpv6SwitchIsReadAndChangedAndNoOptionChangesNothing) {
+TEST(IpDns, IpGetAndSetReadAndChangeTheIpv6SwitchAndNoOptionChangesNothing) {
     TempHost host;
     EXPECT_EQ(RunCommand<IpGet>().Json(), R"({"IPv6 Enabled":true})");
     ExpectDone(RunCommand<IpSet>({"--ipv6-enabled", "false"}));
@@ -231,7 +231,7 @@ TEST(IpGetSet, TheIpv6SwitchIsReadAndChangedAndNoOptionChangesNothing) {
     EXPECT_THROW(RunCommand<IpGet>(), Gantry::Lib::GantryException);
 }
 
-TEST(IpConnectionList, ListsTcpThenUdpThenIpWithTheirWorldsAndStates) {
+TEST(IpDns, ConnectionListShowsTcpThenUdpThenIpWithTheirWorldsAndStates) {
     TempHost host;
     CommandRun run = RunCommand<IpConnectionList>();
     EXPECT_EQ(run.errors, Errors{});
@@ -258,7 +258,7 @@ TEST(IpConnectionList, ListsTcpThenUdpThenIpWithTheirWorldsAndStates) {
     EXPECT_THROW(RunCommand<IpConnectionList>({"-t", "icmp"}), Plinth::Cli::UsageError);
 }
 
-TEST(IpConnectionList, LongEndpointsAreCutTo31CharactersAndUnknownStatesAreEmpty) {
+TEST(IpDns, ConnectionListCutsLongEndpointsTo31CharactersAndLeavesUnknownStatesEmpty) {
     TempHost host([](Json& d) {
         d["netstacks"][0]["connections"] = {
             Connection("tcp", "2001:db8:1234:5678:9abc:def0:1234:5678", 443, "2001:db8::77", 51514, 11, 1000),
@@ -274,7 +274,7 @@ TEST(IpConnectionList, LongEndpointsAreCutTo31CharactersAndUnknownStatesAreEmpty
     EXPECT_EQ(rows[1]["Local Address"], "2001:db8:1234:5678:9abc::1:8080");
 }
 
-TEST(IpConnectionList, AnyHostFailureIsReportedBehindOneLineAndDropsTheRows) {
+TEST(IpDns, ConnectionListReportsAnyHostFailureBehindOneLineAndDropsTheRows) {
     TempHost host(AddStorageNetstack);
     // The storage netstack has no connections at all.
     EXPECT_EQ(RunCommand<IpConnectionList>({"-N", "storage"}).Json(), "[]");

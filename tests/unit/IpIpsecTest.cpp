@@ -105,7 +105,7 @@ TEST(IpIpsecSAList, ShowsEachAssociationWithItsSpiInHexAndItsLifetime) {
               "Lifetime");
 }
 
-TEST(ConvertToHrsMinsAndSecs, NamesTheNonZeroPartsEachWithATrailingBlank) {
+TEST(IpIpsecSAList, ALifetimeNamesItsNonZeroPartsEachWithATrailingBlank) {
     EXPECT_EQ(ConvertToHrsMinsAndSecs(0), "infinite");
     EXPECT_EQ(ConvertToHrsMinsAndSecs(3661), "1h 1m 1s ");
     EXPECT_EQ(ConvertToHrsMinsAndSecs(3600), "1h ");
