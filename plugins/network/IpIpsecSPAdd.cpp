@@ -75,15 +75,16 @@ void IpIpsecSPAdd::ExecuteInternal(boost::shared_ptr<Input> input, boost::shared
     try {
         // Both addresses start at "::" with prefix length 0.
         Gantry::Network::IpSecSpdParam param;
-        std::string saName = input->HasParameter(kSaName) ? input->GetString(kSaName) : "";
+        // An option left out reads as "", which maps to its default.
+        std::string saName = input->GetString(kSaName);
         param.srcPort = input->GetInt(kSourcePort);
         param.dstPort = input->GetInt(kDestinationPort);
         SetNetwork(input->GetString(kSource), param.srcAddress, param.srcPrefixLength);
         SetNetwork(input->GetString(kDestination), param.dstAddress, param.dstPrefixLength);
-        std::string mode = input->HasParameter(kMode) ? input->GetString(kMode) : "";
-        std::string protocol = input->HasParameter(kProtocol) ? input->GetString(kProtocol) : "";
-        std::string direction = input->HasParameter(kDirection) ? input->GetString(kDirection) : "";
-        std::string action = input->HasParameter(kAction) ? input->GetString(kAction) : "";
+        std::string mode = input->GetString(kMode);
+        std::string protocol = input->GetString(kProtocol);
+        std::string direction = input->GetString(kDirection);
+        std::string action = input->GetString(kAction);
         param.protocol = ipsecConfig.StringToIpSecULProtoType(protocol);
         param.direction = ipsecConfig.StringToIpSecDirection(direction);
         param.action = ipsecConfig.StringToIpSecAction(action);
