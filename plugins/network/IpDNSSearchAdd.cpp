@@ -1,6 +1,7 @@
 #include "IpDNSSearchAdd.h"
 
 #include "CommandSupport.h"
+#include "DnsEdit.h"
 #include "NetstackChoice.h"
 #include "trellis/network/DnsConfigImpl.h"
 
@@ -28,17 +29,11 @@ boost::shared_ptr<InputSpec> IpDNSSearchAdd::GetInputSpecInternal() {
 boost::shared_ptr<OutputSpec> IpDNSSearchAdd::GetOutputSpecInternal() { return OutputSpec::Of(MetaBool::New()); }
 
 void IpDNSSearchAdd::ExecuteInternal(boost::shared_ptr<Input> input, boost::shared_ptr<Output> output) {
-    Trellis::Network::DnsConfigImpl dnsConfig(ChosenNetstack(*input));
-    try {
+    RunDnsEdit(*input, *output, [&](Trellis::Network::DnsConfigImpl& dnsConfig) {
         // The host judges the domain's form.
         dnsConfig.AddSearchDomain(input->GetString(kDomain));
-        dnsConfig.SaveConfig();
-    } catch (GantryException& e) {
-        // A refused change is reported and still answered with true.
-        output->SetError(e.GetMessage(0));
-    }
-    output->SetResult(MetaBool::New(true));
-    output->Finish();
+        return true;
+    });
 }
 
 }  // namespace NetworkNamespace

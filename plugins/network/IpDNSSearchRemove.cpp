@@ -1,6 +1,7 @@
 #include "IpDNSSearchRemove.h"
 
 #include "CommandSupport.h"
+#include "DnsEdit.h"
 #include "NetstackChoice.h"
 #include "trellis/network/DnsConfigImpl.h"
 
@@ -29,16 +30,10 @@ boost::shared_ptr<InputSpec> IpDNSSearchRemove::GetInputSpecInternal() {
 boost::shared_ptr<OutputSpec> IpDNSSearchRemove::GetOutputSpecInternal() { return OutputSpec::Of(MetaBool::New()); }
 
 void IpDNSSearchRemove::ExecuteInternal(boost::shared_ptr<Input> input, boost::shared_ptr<Output> output) {
-    Trellis::Network::DnsConfigImpl dnsConfig(ChosenNetstack(*input));
-    try {
+    RunDnsEdit(*input, *output, [&](Trellis::Network::DnsConfigImpl& dnsConfig) {
         dnsConfig.RemoveSearchDomain(input->GetString(kDomain));
-        dnsConfig.SaveConfig();
-    } catch (GantryException& e) {
-        // A refused change is reported and still answered with true.
-        output->SetError(e.GetMessage(0));
-    }
-    output->SetResult(MetaBool::New(true));
-    output->Finish();
+        return true;
+    });
 }
 
 }  // namespace NetworkNamespace

@@ -4,6 +4,7 @@
 #include <string>
 
 #include "CommandSupport.h"
+#include "DnsEdit.h"
 #include "NameServerAddress.h"
 #include "NetstackChoice.h"
 #include "trellis/network/DnsConfigImpl.h"
@@ -31,22 +32,16 @@ boost::shared_ptr<InputSpec> IpDNSServerAdd::GetInputSpecInternal() {
 boost::shared_ptr<OutputSpec> IpDNSServerAdd::GetOutputSpecInternal() { return OutputSpec::Of(MetaBool::New()); }
 
 void IpDNSServerAdd::ExecuteInternal(boost::shared_ptr<Input> input, boost::shared_ptr<Output> output) {
-    Trellis::Network::DnsConfigImpl dnsConfig(ChosenNetstack(*input));
-    try {
+    RunDnsEdit(*input, *output, [&](Trellis::Network::DnsConfigImpl& dnsConfig) {
         std::string server = input->GetString(kServer);
         std::unique_ptr<Gantry::Network::IpAddress> address = ParseNameServer(server);
         if (!address) {
             output->SetError(UnrecognisedAddressText(server));
-            return;
+            return false;
         }
         dnsConfig.AddNameServer(*address);
-        dnsConfig.SaveConfig();
-    } catch (GantryException& e) {
-        // A refused change is reported and still answered with true.
-        output->SetError(e.GetMessage(0));
-    }
-    output->SetResult(MetaBool::New(true));
-    output->Finish();
+        return true;
+    });
 }
 
 }  // namespace NetworkNamespace

@@ -4,6 +4,7 @@
 #include <string>
 
 #include "CommandSupport.h"
+#include "DnsEdit.h"
 #include "NameServerAddress.h"
 #include "NetstackChoice.h"
 #include "trellis/network/DnsConfigImpl.h"
@@ -31,31 +32,25 @@ boost::shared_ptr<InputSpec> IpDNSServerRemove::GetInputSpecInternal() {
 boost::shared_ptr<OutputSpec> IpDNSServerRemove::GetOutputSpecInternal() { return OutputSpec::Of(MetaBool::New()); }
 
 void IpDNSServerRemove::ExecuteInternal(boost::shared_ptr<Input> input, boost::shared_ptr<Output> output) {
-    Trellis::Network::DnsConfigImpl dnsConfig(ChosenNetstack(*input));
-    try {
+    RunDnsEdit(*input, *output, [&](Trellis::Network::DnsConfigImpl& dnsConfig) {
         bool all = input->GetFlag(kAll);
         if (all == input->HasParameter(kServer)) {
             output->SetError("You must specify exactly one of: --all, --server");
-            return;
+            return false;
         }
         if (all) {
             dnsConfig.RemoveNameServers();
-        } else {
-            std::string server = input->GetString(kServer);
-            std::unique_ptr<Gantry::Network::IpAddress> address = ParseNameServer(server);
-            if (!address) {
-                output->SetError(UnrecognisedAddressText(server));
-                return;
-            }
-            dnsConfig.RemoveNameServer(*address);
+            return true;
         }
-        dnsConfig.SaveConfig();
-    } catch (GantryException& e) {
-        // A refused change is reported and still answered with true.
-        output->SetError(e.GetMessage(0));
-    }
-    output->SetResult(MetaBool::New(true));
-    output->Finish();
+        std::string server = input->GetString(kServer);
+        std::unique_ptr<Gantry::Network::IpAddress> address = ParseNameServer(server);
+        if (!address) {
+            output->SetError(UnrecognisedAddressText(server));
+            return false;
+        }
+        dnsConfig.RemoveNameServer(*address);
+        return true;
+    });
 }
 
 }  // namespace NetworkNamespace
