@@ -65,7 +65,7 @@ expect_status 2
 expect_stderr_contains "haldensim: bad description: not valid JSON: parse error at line 2"
 sim import "$WORK/none.json"
 expect_status 2
-expect_stderr "haldensim: cannot read $WORK/none.json: No such file or directory"
+expect_stderr "haldensim: cannot read $WORK/none.json: it does not exist"
 sim export
 expect_stdout "$before"
 

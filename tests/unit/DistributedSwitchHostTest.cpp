@@ -86,15 +86,7 @@ TEST(DistributedSwitchHost, TheDescriptionRefusesWhatCannotBe) {
         {[](Json& d) { PortWithId(d, 33554437)["stats"]["broadcastReceived"] = 12512102; },
          "ports[2].stats: more multicast and broadcast packets received than packets received"},
     };
-    for (const Case& c : cases) {
-        std::string refusal;
-        try {
-            Trellis::Host::ImportHost(TempHost::Edited(c.edit));
-        } catch (const Trellis::Host::DescriptionError& e) {
-            refusal = e.what();
-        }
-        EXPECT_EQ(refusal, c.refusal);
-    }
+    for (const Case& c : cases) EXPECT_EQ(DescriptionRefusal(c.edit), c.refusal);
     EXPECT_TRUE(Trellis::Host::ExportHost() == before);
 }
 

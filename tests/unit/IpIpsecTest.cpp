@@ -274,7 +274,7 @@ TEST(IpIpsecSet, AFileTheHostCannotUseIsRefusedWithItsPathAndChangesNothing) {
     const std::vector<std::pair<std::string, std::string>> refusals = {
         {host.Dir() + "/none.conf", "it does not exist"},
         {host.Dir(), "it is a directory"},
-        {fifo, "it is not a regular file"},
+        {fifo, "it is a FIFO, not a regular file"},
         {large, "it is larger than 65536 bytes"},
         {malformed, "line 2 is neither a [section] nor a name = value setting"},
     };

@@ -149,7 +149,7 @@ TEST(IpServicesHost, AKeyExchangeConfigurationIsReadOnlyFromARegularFileItChecks
     for (const Case& c : std::vector<Case>{
              {dir + "/missing.conf", "it does not exist"},
              {dir, "it is a directory"},
-             {fifo, "it is not a regular file"},
+             {fifo, "it is a FIFO, not a regular file"},
              {large, "it is larger than 65536 bytes"},
              {bad, "line 2 is neither a [section] nor a name = value setting"},
              {empty, "it holds no setting"},

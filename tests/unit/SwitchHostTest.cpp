@@ -267,15 +267,7 @@ TEST(SwitchHost, TheDescriptionRefusesSwitchingThatCannotBe) {
         {[](Json& d) { d["standardSwitches"][0]["numPorts"] = 2; },
          "ports[2]: \"switch0\" has no free port left (2 ports)"},
     };
-    for (const Case& c : cases) {
-        std::string refusal;
-        try {
-            Trellis::Host::ImportHost(TempHost::Edited(c.edit));
-        } catch (const Trellis::Host::DescriptionError& e) {
-            refusal = e.what();
-        }
-        EXPECT_EQ(refusal, c.refusal);
-    }
+    for (const Case& c : cases) EXPECT_EQ(DescriptionRefusal(c.edit), c.refusal);
     EXPECT_TRUE(Trellis::Host::ExportHost() == before);
 }
 

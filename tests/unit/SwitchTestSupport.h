@@ -10,6 +10,7 @@
 #include <nlohmann/json.hpp>
 
 #include "FailureOf.h"
+#include "TempHost.h"
 #include "gantry/lib/GantryException.h"
 #include "trellis/host/Description.h"
 
@@ -41,6 +42,17 @@ inline Json SwitchEntry(const std::string& name, int numPorts, const Json& uplin
 
 inline Json PortGroupEntry(const std::string& name, const std::string& vswitch, int vlanId = 0) {
     return Json{{"name", name}, {"vswitch", vswitch}, {"vlanId", vlanId}};
+}
+
+// What importing the default host, changed by edit, is refused with; "" when
+// it is not refused.
+inline std::string DescriptionRefusal(const std::function<void(Json&)>& edit) {
+    try {
+        Trellis::Host::ImportHost(TempHost::Edited(edit));
+    } catch (const Trellis::Host::DescriptionError& e) {
+        return e.what();
+    }
+    return "";
 }
 
 }  // namespace SwitchTest

@@ -200,15 +200,7 @@ TEST(TslNicHost, TheDescriptionRefusesInterfacesThatCannotBe) {
          },
          "tesselNics[1].ipv4: interface tsl0 of netstack defaultTcpipStack has the address 192.0.2.10 already"},
     };
-    for (const Case& c : cases) {
-        std::string refusal;
-        try {
-            Trellis::Host::ImportHost(TempHost::Edited(c.edit));
-        } catch (const Trellis::Host::DescriptionError& e) {
-            refusal = e.what();
-        }
-        EXPECT_EQ(refusal, c.refusal);
-    }
+    for (const Case& c : cases) EXPECT_EQ(DescriptionRefusal(c.edit), c.refusal);
     EXPECT_TRUE(Trellis::Host::ExportHost() == before);
 }
 

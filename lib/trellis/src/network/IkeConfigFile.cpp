@@ -1,34 +1,15 @@
 #include "IkeConfigFile.h"
 
-#include <fcntl.h>
-#include <sys/stat.h>
-#include <unistd.h>
-
-#include <cerrno>
-#include <cstring>
 #include <sstream>
 
 #include "gantry/lib/GantryException.h"
 #include "host/StoredText.h"
+#include "util/UserFile.h"
 
 namespace Trellis {
 namespace Network {
 
 namespace {
-
-class Descriptor {
-public:
-    explicit Descriptor(int fd) : fd_(fd) {}
-    ~Descriptor() {
-        if (fd_ >= 0) ::close(fd_);
-    }
-    Descriptor(const Descriptor&) = delete;
-    Descriptor& operator=(const Descriptor&) = delete;
-    int Get() const { return fd_; }
-
-private:
-    int fd_;
-};
 
 std::string Trim(std::string const& text) {
     std::size_t begin = text.find_first_not_of(" \t\r");
@@ -67,22 +48,11 @@ std::string ReadIkeConfig(std::string const& path, long maxSize) {
     const std::string refusal = "Unable to use the IKE configuration " + Trellis::Host::Printable(path) + ": ";
     auto refuse = [&](std::string const& reason) { throw Gantry::Lib::GantryException(refusal + reason); };
     if (path.empty()) throw Gantry::Lib::GantryException("Unable to use an IKE configuration: no path was given");
-    Descriptor file(::open(path.c_str(), O_RDONLY | O_NONBLOCK | O_NOCTTY | O_CLOEXEC));
-    if (file.Get() < 0) refuse(errno == ENOENT ? "it does not exist" : std::strerror(errno));
-    struct stat status {};
-    if (::fstat(file.Get(), &status) != 0) refuse(std::strerror(errno));
-    if (S_ISDIR(status.st_mode)) refuse("it is a directory");
-    if (!S_ISREG(status.st_mode)) refuse("it is not a regular file");
-    if (status.st_size > maxSize) refuse("it is larger than " + std::to_string(maxSize) + " bytes");
     std::string text;
-    char buffer[8192];
-    for (;;) {
-        ssize_t got = ::read(file.Get(), buffer, sizeof buffer);
-        if (got < 0 && errno == EINTR) continue;
-        if (got < 0) refuse(std::strerror(errno));
-        if (got == 0) break;
-        text.append(buffer, static_cast<std::size_t>(got));
-        if (static_cast<long>(text.size()) > maxSize) refuse("it is larger than " + std::to_string(maxSize) + " bytes");
+    try {
+        text = Trellis::Util::ReadUserFile(path, static_cast<std::size_t>(maxSize));
+    } catch (const Trellis::Util::UnreadableFile& e) {
+        refuse(e.what());
     }
     // Line ends and tabs are the text's own; other control characters are not.
     std::string withoutLineEnds = text;
