@@ -129,8 +129,8 @@ TEST(IpInterfaceAdd, RefusesAConnectionPointInTheOrderOfItsChecksAndLeavesTheHos
     // The name's pattern as the reference tables write it, their "\|" escapes for "|" aside.
     std::string documented = "tsl([0-9]\\|[1-9][0-9]\\|1[0-9][0-9]\\|2[0-4][0-9]\\|25[0-5])";
     documented.erase(std::remove(documented.begin(), documented.end(), '\\'), documented.end());
-    const auto spec = IpInterfaceAdd::New()->GetInputSpec();
-    for (const auto& parameter : spec->GetParameters())
+    const auto inputSpec = IpInterfaceAdd::New()->GetInputSpec();
+    for (const auto& parameter : inputSpec->GetParameters())
         if (parameter->GetName() == "interface-name")
             EXPECT_EQ(parameter->GetConstraint()->GetStringRegex(), documented);
     EXPECT_EQ(ExportHost(), before);

@@ -78,8 +78,8 @@ TEST(IpNetstackInstanceSet, OffersTheHostsAlgorithmsAndRefusesOthers) {
     boost::shared_ptr<IpNetstackInstanceSet> command = IpNetstackInstanceSet::New();
     using Choices = std::vector<Plinth::CallSpec::ParameterConstraint::StringEnumValue>;
     Choices choices;
-    boost::shared_ptr<Plinth::CallSpec::InputSpec> spec = command->GetInputSpec();
-    for (const auto& parameter : spec->GetParameters())
+    boost::shared_ptr<Plinth::CallSpec::InputSpec> inputSpec = command->GetInputSpec();
+    for (const auto& parameter : inputSpec->GetParameters())
         if (parameter->GetName() == "ccalgo") choices = parameter->GetConstraint()->GetStringEnum();
     EXPECT_EQ(choices, (Choices{{"newreno", "Set newreno as the algorithm"}, {"cubic", "Set cubic as the algorithm"}}));
     EXPECT_THROW(RunCommand<IpNetstackInstanceSet>({"-N", "defaultTcpipStack", "-c", "bbr"}), Plinth::Cli::UsageError);

@@ -1,7 +1,6 @@
 #include "trellis/network/DnsConfigImpl.h"
 
 #include <algorithm>
-#include <cctype>
 #include <sstream>
 
 #include "RoutingStore.h"
@@ -31,12 +30,6 @@ const Operation kSaveConfig("DnsConfigImpl::SaveConfig");
 
 [[noreturn]] void Refuse(std::string const& message) { throw Gantry::Lib::GantryException(message); }
 
-bool SameDomain(std::string const& a, std::string const& b) {
-    return a.size() == b.size() && std::equal(a.begin(), a.end(), b.begin(), [](char x, char y) {
-               return std::tolower(static_cast<unsigned char>(x)) == std::tolower(static_cast<unsigned char>(y));
-           });
-}
-
 }  // namespace
 
 DnsConfigImpl::DnsConfigImpl(std::string const& netstackKey)
@@ -47,7 +40,7 @@ DnsConfigImpl::~DnsConfigImpl() {}
 
 // Refuses an edit that does not fit dns: at the edit against what was read,
 // and again at the save against the configuration as it stands then.
-void DnsConfigImpl::Apply(Edit const& edit, DnsRecord& dns, bool /*checked*/) const {
+void DnsConfigImpl::Apply(Edit const& edit, DnsRecord& dns) const {
     auto& servers = dns.nameServers;
     auto& domains = dns.searchDomains;
     switch (edit.kind) {
@@ -72,8 +65,7 @@ void DnsConfigImpl::Apply(Edit const& edit, DnsRecord& dns, bool /*checked*/) co
             domains.push_back(edit.value);
             break;
         case Edit::Kind::RemoveDomain: {
-            auto found = std::find_if(domains.begin(), domains.end(),
-                                      [&](std::string const& held) { return SameDomain(held, edit.value); });
+            auto found = dns.FindDomain(edit.value);
             if (found == domains.end())
                 Refuse("The search domain " + Trellis::Host::Printable(edit.value) + " is not configured for netstack " +
                        netstackKey_);
@@ -87,21 +79,21 @@ void DnsConfigImpl::AddNameServer(Gantry::Network::IpAddress& server) {
     kAddNameServer.Check();
     if (server.IsUnset()) Refuse("Invalid name server " + server.GetStringAddress() + ": it is the unspecified address");
     Edit edit{Edit::Kind::AddServer, server.GetStringAddress()};
-    Apply(edit, dns_, true);
+    Apply(edit, dns_);
     edits_.push_back(edit);
 }
 
 void DnsConfigImpl::RemoveNameServer(Gantry::Network::IpAddress& server) {
     kRemoveNameServer.Check();
     Edit edit{Edit::Kind::RemoveServer, server.GetStringAddress()};
-    Apply(edit, dns_, true);
+    Apply(edit, dns_);
     edits_.push_back(edit);
 }
 
 void DnsConfigImpl::RemoveNameServers() {
     kRemoveNameServers.Check();
     Edit edit{Edit::Kind::RemoveServers, ""};
-    Apply(edit, dns_, true);
+    Apply(edit, dns_);
     edits_.push_back(edit);
 }
 
@@ -117,14 +109,14 @@ void DnsConfigImpl::AddSearchDomain(std::string const& domain) {
         Refuse("Invalid search domain " + Trellis::Host::Printable(domain) +
                ": a domain name has no blanks or control characters");
     Edit edit{Edit::Kind::AddDomain, domain};
-    Apply(edit, dns_, true);
+    Apply(edit, dns_);
     edits_.push_back(edit);
 }
 
 void DnsConfigImpl::RemoveSearchDomain(std::string domain) {
     kRemoveSearchDomain.Check();
     Edit edit{Edit::Kind::RemoveDomain, domain};
-    Apply(edit, dns_, true);
+    Apply(edit, dns_);
     edits_.push_back(edit);
 }
 
@@ -138,7 +130,7 @@ std::string DnsConfigImpl::GetSearchDomainsString() {
 void DnsConfigImpl::SaveConfig() {
     dns_ = kSaveConfig.Write([&](Transaction& t) {
         NetstackRecord netstack = RoutingStore::RequireNetstack(t, netstackKey_);
-        for (Edit const& edit : edits_) Apply(edit, netstack.dns, false);
+        for (Edit const& edit : edits_) Apply(edit, netstack.dns);
         t.Put(netstack);
         return netstack.dns;
     });

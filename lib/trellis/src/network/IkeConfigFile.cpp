@@ -19,7 +19,7 @@ std::string Trim(std::string const& text) {
 }
 
 // Why the text is no configuration; "" when it is one.
-std::string TextProblem(std::string const& text) {
+std::string ConfigProblem(std::string const& text) {
     std::istringstream lines(text);
     std::string line;
     int number = 0;
@@ -60,7 +60,7 @@ std::string ReadIkeConfig(std::string const& path, long maxSize) {
         if (c == '\n' || c == '\t' || c == '\r') c = ' ';
     std::string problem = Trellis::Host::TextProblem(withoutLineEnds);
     if (!problem.empty()) refuse("its text " + problem);
-    problem = TextProblem(text);
+    problem = ConfigProblem(text);
     if (!problem.empty()) refuse(problem);
     return text;
 }

@@ -137,15 +137,38 @@ void RemoveRoute(Operation const& operation, std::string const& key, typename F:
     });
 }
 
-// The default gateway in force: the one configured while an interface
-// reaches it.
-template <class F>
-typename F::Address GatewayInForce(Transaction const& t, std::string const& key) {
-    NetstackRecord netstack = RoutingStore::RequireNetstack(t, key);
+// The default gateway in force: the one configured while an interface of
+// the netstack (subnets) reaches it.
+template <class F, class Subnets>
+typename F::Address GatewayInForce(NetstackRecord& netstack, Subnets const& subnets) {
     const std::string& gateway = F::Gateway(netstack.routing);
     if (gateway.empty()) return typename F::Address();
     typename F::Address address(gateway);
-    return RoutingStore::InterfaceOf(F::Subnets(t, key), address).empty() ? typename F::Address() : address;
+    return RoutingStore::InterfaceOf(subnets, address).empty() ? typename F::Address() : address;
+}
+
+template <class F>
+typename F::Address GatewayInForce(Transaction const& t, std::string const& key) {
+    NetstackRecord netstack = RoutingStore::RequireNetstack(t, key);
+    return GatewayInForce<F>(netstack, F::Subnets(t, key));
+}
+
+// The routes in force: each interface's own subnet, then the routes, then the
+// default route while an interface reaches the default gateway.
+template <class F, class Route>
+std::vector<Route> RoutesInForce(Transaction const& t, std::string const& key) {
+    NetstackRecord netstack = RoutingStore::RequireNetstack(t, key);
+    const auto subnets = F::Subnets(t, key);
+    std::vector<Route> routes;
+    for (auto const& subnet : subnets) routes.push_back({subnet.network, typename F::Address(), subnet.interfaceName});
+    for (RouteRecord const& route : F::Routes(netstack.routing)) {
+        typename F::Address gateway(route.gateway);
+        routes.push_back({typename F::Network(route.network), gateway, RoutingStore::InterfaceOf(subnets, gateway)});
+    }
+    typename F::Address gateway = GatewayInForce<F>(netstack, subnets);
+    if (gateway != typename F::Address())
+        routes.push_back({F::Default(), gateway, RoutingStore::InterfaceOf(subnets, gateway)});
+    return routes;
 }
 
 template <class F>
@@ -165,15 +188,19 @@ Neighbor NeighborOf(NeighborRecord const& record) {
     return neighbor;
 }
 
-// The entry of the neighbour's address on its interface (any, when it names
-// none).
+// Whether the entry is the neighbour's: its address, on its interface (any,
+// when it names none).
+template <class Neighbor>
+bool IsEntryOf(NeighborRecord const& record, Neighbor const& neighbor) {
+    return decltype(neighbor.address)(record.address) == neighbor.address &&
+           (neighbor.interfaceName.empty() || record.interfaceName == neighbor.interfaceName);
+}
+
 template <class Neighbor>
 NeighborRecord const& RequireNeighbor(std::vector<NeighborRecord> const& table, Neighbor const& neighbor,
                                       std::string const& key) {
     for (NeighborRecord const& record : table)
-        if (decltype(neighbor.address)(record.address) == neighbor.address &&
-            (neighbor.interfaceName.empty() || record.interfaceName == neighbor.interfaceName))
-            return record;
+        if (IsEntryOf(record, neighbor)) return record;
     Refuse("Netstack instance " + key + " has no neighbour entry for " + neighbor.address.GetStringAddress() +
            (neighbor.interfaceName.empty() ? "" : " on " + neighbor.interfaceName));
 }
@@ -185,11 +212,7 @@ void RemoveNeighbor(Operation const& operation, std::string const& key, Neighbor
         auto& table = ipv6 ? netstack.routing.ipv6Neighbors : netstack.routing.ipv4Neighbors;
         RequireNeighbor(table, neighbor, key);
         table.erase(std::remove_if(table.begin(), table.end(),
-                                   [&](NeighborRecord const& record) {
-                                       return decltype(neighbor.address)(record.address) == neighbor.address &&
-                                              (neighbor.interfaceName.empty() ||
-                                               record.interfaceName == neighbor.interfaceName);
-                                   }),
+                                   [&](NeighborRecord const& record) { return IsEntryOf(record, neighbor); }),
                     table.end());
         t.Put(netstack);
     });
@@ -223,39 +246,13 @@ void RoutingInfoImpl::RemoveIpv6TesselRoute(Ipv6Network network, Ipv6Address gat
 }
 
 std::vector<Gantry::Network::Ipv4Route> RoutingInfoImpl::GetCurrentTesselRoutes() {
-    return kGetCurrentTesselRoutes.Read([&](Transaction& t) {
-        NetstackRecord netstack = RoutingStore::RequireNetstack(t, netstackKey_);
-        auto subnets = RoutingStore::Ipv4Subnets(t, netstackKey_);
-        std::vector<Gantry::Network::Ipv4Route> routes;
-        for (RoutingStore::Ipv4Subnet const& subnet : subnets)
-            routes.push_back({subnet.network, Ipv4Address(), subnet.interfaceName});
-        for (RouteRecord const& route : netstack.routing.ipv4Routes) {
-            Ipv4Address gateway(route.gateway);
-            routes.push_back({Ipv4Network(route.network), gateway, RoutingStore::InterfaceOf(subnets, gateway)});
-        }
-        Ipv4Address gateway = GatewayInForce<Ipv4Family>(t, netstackKey_);
-        if (gateway.GetValue() != 0)
-            routes.push_back({DEFAULT_IPV4_ROUTE, gateway, RoutingStore::InterfaceOf(subnets, gateway)});
-        return routes;
-    });
+    return kGetCurrentTesselRoutes.Read(
+        [&](Transaction& t) { return RoutesInForce<Ipv4Family, Gantry::Network::Ipv4Route>(t, netstackKey_); });
 }
 
 std::vector<Gantry::Network::Ipv6Route> RoutingInfoImpl::GetCurrentIpv6TesselRoutes() {
-    return kGetCurrentIpv6TesselRoutes.Read([&](Transaction& t) {
-        NetstackRecord netstack = RoutingStore::RequireNetstack(t, netstackKey_);
-        auto subnets = RoutingStore::Ipv6Subnets(t, netstackKey_);
-        std::vector<Gantry::Network::Ipv6Route> routes;
-        for (RoutingStore::Ipv6Subnet const& subnet : subnets)
-            routes.push_back({subnet.network, Ipv6Address(), subnet.interfaceName});
-        for (RouteRecord const& route : netstack.routing.ipv6Routes) {
-            Ipv6Address gateway(route.gateway);
-            routes.push_back({Ipv6Network(route.network), gateway, RoutingStore::InterfaceOf(subnets, gateway)});
-        }
-        Ipv6Address gateway = GatewayInForce<Ipv6Family>(t, netstackKey_);
-        if (gateway != Ipv6Address())
-            routes.push_back({DEFAULT_IPV6_ROUTE, gateway, RoutingStore::InterfaceOf(subnets, gateway)});
-        return routes;
-    });
+    return kGetCurrentIpv6TesselRoutes.Read(
+        [&](Transaction& t) { return RoutesInForce<Ipv6Family, Gantry::Network::Ipv6Route>(t, netstackKey_); });
 }
 
 std::string RoutingInfoImpl::GetDefaultGatewaySource(Ipv4Network network) {

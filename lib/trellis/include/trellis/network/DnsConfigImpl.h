@@ -42,7 +42,7 @@ private:
         enum class Kind { AddServer, RemoveServer, RemoveServers, AddDomain, RemoveDomain } kind;
         std::string value;
     };
-    void Apply(Edit const& edit, Trellis::Host::DnsRecord& dns, bool checked) const;
+    void Apply(Edit const& edit, Trellis::Host::DnsRecord& dns) const;
 
     std::string netstackKey_;
     Trellis::Host::DnsRecord dns_;

@@ -105,6 +105,11 @@ bool SameDomain(const std::string& a, const std::string& b) {
 
 }  // namespace
 
+std::vector<std::string>::iterator DnsRecord::FindDomain(const std::string& domain) {
+    return std::find_if(searchDomains.begin(), searchDomains.end(),
+                        [&](const std::string& held) { return SameDomain(held, domain); });
+}
+
 bool DnsRecord::HasDomain(const std::string& domain) const {
     return std::any_of(searchDomains.begin(), searchDomains.end(),
                        [&](const std::string& held) { return SameDomain(held, domain); });

@@ -53,7 +53,9 @@ struct DnsRecord {
     std::vector<std::string> nameServers;
     std::vector<std::string> searchDomains;
 
-    // Whether the list has the domain, compared without regard to case.
+    // The list's entry of the domain, compared without regard to case; end()
+    // when it has none.
+    std::vector<std::string>::iterator FindDomain(const std::string& domain);
     bool HasDomain(const std::string& domain) const;
     Json ToJson() const;
     static DnsRecord FromJson(const JsonReader& in);  // absent: none
