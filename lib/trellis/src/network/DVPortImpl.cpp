@@ -3,10 +3,10 @@
 #include <utility>
 
 #include "ConnectionPoints.h"
+#include "DVSwitchStore.h"
 #include "gantry/lib/GantryException.h"
 #include "host/StoredText.h"
 #include "trellis/host/Operation.h"
-#include "trellis/host/records/PortRecord.h"
 
 namespace Trellis {
 namespace Network {
@@ -33,13 +33,6 @@ DVPortRecord RequirePort(Transaction const& t, std::string const& dvsId, std::st
                                            " does not exist on the distributed switch " +
                                            Trellis::Host::Printable(dvsId));
     return *port;
-}
-
-std::vector<std::string> ClientsOf(Transaction const& t, DVPortRecord const& port) {
-    std::vector<std::string> clients;
-    for (Trellis::Host::PortRecord const& client : t.ChildrenOf<Trellis::Host::PortRecord>(port.dvswitch))
-        if (client.dvPort == port.portId) clients.push_back(client.clientName);
-    return clients;
 }
 
 }  // namespace
@@ -73,7 +66,7 @@ bool DVPortImpl::IsInUse(std::vector<std::string>& clients) {
     } else {
         clients_ = kIsInUse.Read([&](Transaction& t) {
             if (!record_) record_ = RequirePort(t, dvsId_, portId_);
-            return ClientsOf(t, *record_);
+            return DVSwitchStore::ClientsByPort(t, record_->dvswitch)[record_->portId];
         });
     }
     clients = *clients_;
