@@ -8,6 +8,7 @@
 #include "gantry/network/NetworkInfo.h"
 #include "gantry/network/Pnic.h"
 #include "gantry/network/PortGroup.h"
+#include "gantry/network/SriovNic.h"
 
 namespace Trellis {
 namespace Network {
@@ -23,9 +24,19 @@ public:
     int GetNetstackInstanceState(std::string const& key) override;
 
     // Every physical NIC, in the host's order.
-    std::vector<Gantry::Network::Pnic*> GetPnics();
+    std::vector<Gantry::Network::Pnic*> GetPnics() override;
     // The NIC of that name, or null.
-    Gantry::Network::Pnic* GetPnicByName(std::string const& name);
+    Gantry::Network::Pnic* GetPnicByName(std::string const& name) override;
+    // Every NIC with SR-IOV enabled (a physical function), in the host's order.
+    std::vector<Gantry::Network::Pnic*> GetSriovNics();
+    // The SR-IOV NIC of that name, or null (also for a NIC without SR-IOV).
+    Gantry::Network::Pnic* GetSriovNicByName(std::string const& name);
+    // One entry per virtual function of the NIC, in the order of their ids;
+    // released by DeleteVector. Refuses a NIC that is no SR-IOV NIC.
+    std::vector<Gantry::Network::SriovNicVFInfo*> GetSriovNicVFInfo(std::string const& nicName);
+    // The counters of one virtual function. Refuses a NIC that is no SR-IOV
+    // NIC and an id that is no function of it.
+    void GetSriovNicVFStats(Gantry::Network::SriovNicVFStats* stats, std::string const& nicName, int vfId);
     // Stores a new instance (made on values), in the kernel unless disabled.
     // Refuses an empty key and a key the host has.
     void AddNetstackInstance(Gantry::Network::NetstackInstance* instance, bool disabled);

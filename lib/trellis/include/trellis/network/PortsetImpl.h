@@ -3,6 +3,7 @@
 #include <string>
 #include <vector>
 
+#include "gantry/network/PnicStats.h"
 #include "gantry/network/Portset.h"
 
 namespace Trellis {
@@ -40,6 +41,13 @@ public:
     // The ports in use on the switch (clients and uplinks), in the host's
     // order; owned by the caller.
     std::vector<PortImpl*> GetPorts();
+    // The counters of each VLAN active on the uplink of that NIC, in the
+    // order of their ids; released by DeleteVector. Empty while collection
+    // is off. Refuses a NIC that is no uplink of the switch.
+    std::vector<Gantry::Network::VlanStats*> GetUplinkVlanStats(std::string nicName);
+    // Switches the collection of VLAN counters on the uplink on or off;
+    // switching it off drops the counters.
+    void SetUplinkVlanStatsEnabled(std::string nicName, bool enabled);
 
     // Whether a standard switch of that name exists.
     static bool IsValidVirtualSwitch(std::string const& name);

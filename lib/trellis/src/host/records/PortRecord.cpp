@@ -100,6 +100,12 @@ Json PortRecord::ToJson() const {
         for (const PortFilterRecord& filter : filters) filterList.push_back(filter.ToJson());
         port["filters"] = filterList;
     }
+    if (vlanStats) {
+        Json vlans = Json::array();
+        for (const VlanCounterRecord& vlan : *vlanStats)
+            vlans.push_back(Json{{"vlanId", vlan.vlanId}, {"rxPackets", vlan.rxPackets}, {"txPackets", vlan.txPackets}});
+        port["vlanStats"] = vlans;
+    }
     return port;
 }
 
@@ -140,6 +146,21 @@ PortRecord PortRecord::FromJson(const JsonReader& in) {
     record.teamUplink = OptionalText(in, "teamUplink");
     record.stats = PortStatsRecord::FromJson(in.Member("stats"));
     for (const JsonReader& element : in.Array("filters")) record.filters.push_back(PortFilterRecord::FromJson(element));
+    if (in.Member("vlanStats").IsPresent()) {
+        if (record.clientKind != PortClientKind::Uplink)
+            in.Member("vlanStats").Fail("only an uplink's port counts per VLAN");
+        record.vlanStats.emplace();
+        for (const JsonReader& element : in.Array("vlanStats")) {
+            VlanCounterRecord vlan;
+            vlan.vlanId = static_cast<int>(element.Int("vlanId", 1, 4094));
+            if (!record.vlanStats->empty() && record.vlanStats->back().vlanId >= vlan.vlanId)
+                element.Member("vlanId").Fail("expected VLAN ids in ascending order, each once");
+            vlan.rxPackets = Counter(element, "rxPackets");
+            vlan.txPackets = Counter(element, "txPackets");
+            element.RejectUnknownMembers();
+            record.vlanStats->push_back(vlan);
+        }
+    }
     in.RejectUnknownMembers();
     return record;
 }

@@ -6,6 +6,7 @@
 // uplinks.
 
 #include <cstdint>
+#include <optional>
 #include <string>
 #include <vector>
 
@@ -50,6 +51,13 @@ struct PortFilterRecord {
     static PortFilterRecord FromJson(const JsonReader& in);
 };
 
+// The counters of one VLAN on an uplink's port.
+struct VlanCounterRecord {
+    int vlanId = 0;
+    std::uint64_t rxPackets = 0;
+    std::uint64_t txPackets = 0;
+};
+
 struct PortRecord {
     static constexpr const char* kKind = "port";
 
@@ -68,6 +76,9 @@ struct PortRecord {
     std::string teamUplink;   // the NIC carrying the port's traffic
     PortStatsRecord stats;
     std::vector<PortFilterRecord> filters;
+    // An uplink's counters per active VLAN, in the order of their ids; none
+    // while their collection is off.
+    std::optional<std::vector<VlanCounterRecord>> vlanStats;
 
     std::string Parent() const { return portset; }
     Json ToJson() const;  // without the name
