@@ -45,7 +45,7 @@ TEST(HostScale, EachCopyIsTheDefaultHostRenamedWithItsReferencesWithinIt) {
     for (const char* single : {"enabled", "defaultAction", "rulesetsLoaded", "dynamicRules"})
         EXPECT_EQ(scaled["firewall"][single], original["firewall"][single]) << single;
     EXPECT_EQ(scaled["firewall"]["rulesets"].size(), 3 * original["firewall"]["rulesets"].size());
-    EXPECT_EQ(scaled["nics"].size(), 18u);
+    EXPECT_EQ(scaled["nics"].size(), 21u);
     EXPECT_EQ(scaled["standardSwitches"].size(), 3u);
     EXPECT_EQ(scaled["portGroups"].size(), 6u);
     EXPECT_EQ(scaled["distributedSwitches"].size(), 6u);
@@ -56,12 +56,15 @@ TEST(HostScale, EachCopyIsTheDefaultHostRenamedWithItsReferencesWithinIt) {
     Json ruleset = Named(original["firewall"]["rulesets"], "webAccess");
     ruleset["name"] = "webAccess-2";
     EXPECT_EQ(Named(scaled["firewall"]["rulesets"], "webAccess-2"), ruleset);
+    // A NIC's address and its virtual function's VM are the copy's own.
     Json nic = Named(original["nics"], "pnet1");
-    nic["name"] = "pnet13";
-    EXPECT_EQ(Named(scaled["nics"], "pnet13"), nic);
+    nic["name"] = "pnet15";
+    nic["macAddress"] = "a0:36:9f:1c:30:41";
+    nic["sriov"]["virtualFunctions"][0]["ownerWorldId"] = std::to_string(Named(scaled["worlds"], "web03")["id"].get<int>());
+    EXPECT_EQ(Named(scaled["nics"], "pnet15"), nic);
     const Json& vswitch = Named(scaled["standardSwitches"], "switch2");
-    EXPECT_EQ(vswitch["uplinks"], Json({"pnet12"}));
-    EXPECT_EQ(vswitch["policy"]["teaming"]["uplinkOrder"], Json({"pnet12"}));
+    EXPECT_EQ(vswitch["uplinks"], Json({"pnet14"}));
+    EXPECT_EQ(vswitch["policy"]["teaming"]["uplinkOrder"], Json({"pnet14"}));
     EXPECT_EQ(vswitch["numPorts"], 128);  // three times 128 is within the host's limit
     EXPECT_EQ(Named(scaled["portGroups"], "Guest Network-2")["vswitch"], "switch2");
     const Json& interfacePort = scaled["ports"][17];
@@ -75,10 +78,10 @@ TEST(HostScale, EachCopyIsTheDefaultHostRenamedWithItsReferencesWithinIt) {
     EXPECT_EQ(adapterPort["portset"], "dvSwitch4");
     EXPECT_EQ(adapterPort["clientName"], world["name"].get<std::string>() + ".eth1");
     EXPECT_EQ(adapterPort["worldId"], world["id"]);
-    EXPECT_EQ(adapterPort["teamUplink"], "pnet16");
+    EXPECT_EQ(adapterPort["teamUplink"], "pnet18");
     EXPECT_EQ(adapterPort["macAddresses"], Json({"00:50:56:a1:02:03"}));
     const Json& dvs = Named(scaled["distributedSwitches"], "dvSwitch4");
-    EXPECT_EQ(dvs["lacpGroups"][0]["nics"][0]["name"], "pnet16");
+    EXPECT_EQ(dvs["lacpGroups"][0]["nics"][0]["name"], "pnet18");
     EXPECT_NE(dvs["id"], Named(scaled["distributedSwitches"], "dvSwitch0")["id"]);
 
     const std::string exported = ExportHost();

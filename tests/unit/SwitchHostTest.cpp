@@ -288,7 +288,7 @@ TEST(SwitchHost, AnOlderHostGetsTheDefaultSwitchingAndKeepsTheRest) {
 
     host.Reopen();
     EXPECT_EQ(Switch("switch0")["mtu"], 1500);  // seeded from the default host
-    EXPECT_EQ(Section("nics").size(), 6u);
+    EXPECT_EQ(Section("nics").size(), 7u);
     EXPECT_EQ(Section("ports").size(), 8u);
     EXPECT_EQ(Section("distributedSwitches").size(), 2u);
     EXPECT_EQ(Section("firewall")["enabled"], false);

@@ -5,6 +5,7 @@
 #include "host/DistributedMigration.h"
 #include "host/InterfaceMigration.h"
 #include "host/IpServicesMigration.h"
+#include "host/NicDeviceMigration.h"
 #include "host/RoutingMigration.h"
 #include "host/Sqlite.h"
 #include "host/description/DescriptionIo.h"
@@ -51,6 +52,8 @@ const std::vector<Migration>& Migrations() {
         {6, "netstack instances and kernel interfaces", [](Transaction& t) { MigrateToKernelInterfaces(t); }},
         {7, "the host's IPv6 switch and the routing of its netstacks", [](Transaction& t) { MigrateToRouting(t); }},
         {8, "name servers, connections, the host's own worlds and IPsec", [](Transaction& t) { MigrateToIpServices(t); }},
+        {9, "the NICs' devices: PCI devices, link settings, diagnostics, counters, tuning and SR-IOV",
+         [](Transaction& t) { MigrateToNicDevices(t); }},
     };
     return steps;
 }

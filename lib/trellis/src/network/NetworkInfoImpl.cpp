@@ -1,5 +1,7 @@
 #include "trellis/network/NetworkInfoImpl.h"
 
+#include <algorithm>
+#include <iterator>
 #include <optional>
 #include <utility>
 
@@ -61,6 +63,32 @@ void ConnectionsOf(Operation const& operation, int protocol, std::string const& 
 const Operation kGetPnics("NetworkInfoImpl::GetPnics");
 const Operation kGetPnicByName("NetworkInfoImpl::GetPnicByName");
 const Operation kGetAllPortGroups("NetworkInfoImpl::GetAllPortGroups");
+const Operation kGetSriovNics("NetworkInfoImpl::GetSriovNics");
+const Operation kGetSriovNicByName("NetworkInfoImpl::GetSriovNicByName");
+const Operation kGetSriovNicVFInfo("NetworkInfoImpl::GetSriovNicVFInfo");
+const Operation kGetSriovNicVFStats("NetworkInfoImpl::GetSriovNicVFStats");
+
+// The virtual functions of an SR-IOV NIC; refuses any other NIC.
+std::vector<Trellis::Host::SriovVfRecord> RequireVirtualFunctions(Transaction const& t, std::string const& name) {
+    std::optional<PnicRecord> nic = t.Find<PnicRecord>(name);
+    if (!nic) throw Gantry::Lib::GantryException("Physical NIC " + Trellis::Host::Printable(name) + " does not exist");
+    if (!nic->sriov) throw Gantry::Lib::GantryException("Physical NIC " + Trellis::Host::Printable(name) + " has no SR-IOV");
+    return std::move(*nic->sriov);
+}
+
+// Each counter of SriovNicVFStats, in the order of the stored counters.
+constexpr std::uint64_t Gantry::Network::SriovNicVFStats::*kVfStatsFields[] = {
+    &Gantry::Network::SriovNicVFStats::rxUnicastPkts,      &Gantry::Network::SriovNicVFStats::rxUnicastBytes,
+    &Gantry::Network::SriovNicVFStats::rxMulticastPkts,    &Gantry::Network::SriovNicVFStats::rxMulticastBytes,
+    &Gantry::Network::SriovNicVFStats::rxBroadcastPkts,    &Gantry::Network::SriovNicVFStats::rxBroadcastBytes,
+    &Gantry::Network::SriovNicVFStats::rxOutOfBufferDrops, &Gantry::Network::SriovNicVFStats::rxErrorDrops,
+    &Gantry::Network::SriovNicVFStats::rxLroPkts,          &Gantry::Network::SriovNicVFStats::rxLroBytes,
+    &Gantry::Network::SriovNicVFStats::txUnicastPkts,      &Gantry::Network::SriovNicVFStats::txUnicastBytes,
+    &Gantry::Network::SriovNicVFStats::txMulticastPkts,    &Gantry::Network::SriovNicVFStats::txMulticastBytes,
+    &Gantry::Network::SriovNicVFStats::txBroadcastPkts,    &Gantry::Network::SriovNicVFStats::txBroadcastBytes,
+    &Gantry::Network::SriovNicVFStats::txErrors,           &Gantry::Network::SriovNicVFStats::txDiscards,
+    &Gantry::Network::SriovNicVFStats::txTsoPkts,          &Gantry::Network::SriovNicVFStats::txTsoBytes};
+static_assert(std::size(kVfStatsFields) == std::size(Trellis::Host::kVfCounterNames));
 
 }  // namespace
 
@@ -78,6 +106,41 @@ std::vector<Gantry::Network::Pnic*> NetworkInfoImpl::GetPnics() {
 Gantry::Network::Pnic* NetworkInfoImpl::GetPnicByName(std::string const& name) {
     bool found = kGetPnicByName.Read([&](Transaction& t) { return t.Contains<PnicRecord>(name); });
     return found ? new PnicImpl(name) : nullptr;
+}
+
+std::vector<Gantry::Network::Pnic*> NetworkInfoImpl::GetSriovNics() {
+    std::vector<PnicRecord> records = kGetSriovNics.Read([](Transaction& t) { return t.List<PnicRecord>(); });
+    std::vector<Gantry::Network::Pnic*> nics;
+    for (PnicRecord& record : records)
+        if (record.sriov) nics.push_back(new PnicImpl(std::move(record)));
+    return nics;
+}
+
+Gantry::Network::Pnic* NetworkInfoImpl::GetSriovNicByName(std::string const& name) {
+    std::optional<PnicRecord> record = kGetSriovNicByName.Read([&](Transaction& t) { return t.Find<PnicRecord>(name); });
+    return record && record->sriov ? new PnicImpl(std::move(*record)) : nullptr;
+}
+
+std::vector<Gantry::Network::SriovNicVFInfo*> NetworkInfoImpl::GetSriovNicVFInfo(std::string const& nicName) {
+    std::vector<Trellis::Host::SriovVfRecord> functions =
+        kGetSriovNicVFInfo.Read([&](Transaction& t) { return RequireVirtualFunctions(t, nicName); });
+    std::sort(functions.begin(), functions.end(),
+              [](Trellis::Host::SriovVfRecord const& a, Trellis::Host::SriovVfRecord const& b) { return a.id < b.id; });
+    std::vector<Gantry::Network::SriovNicVFInfo*> infos;
+    for (Trellis::Host::SriovVfRecord const& vf : functions)
+        infos.push_back(new Gantry::Network::SriovNicVFInfo{vf.id, vf.active, vf.pciAddress, vf.ownerWorldId});
+    return infos;
+}
+
+void NetworkInfoImpl::GetSriovNicVFStats(Gantry::Network::SriovNicVFStats* stats, std::string const& nicName, int vfId) {
+    Trellis::Host::SriovVfRecord vf = kGetSriovNicVFStats.Read([&](Transaction& t) {
+        for (Trellis::Host::SriovVfRecord& function : RequireVirtualFunctions(t, nicName))
+            if (function.id == vfId) return function;
+        throw Gantry::Lib::GantryException("Physical NIC " + Trellis::Host::Printable(nicName) +
+                                           " has no virtual function " + std::to_string(vfId));
+    });
+    if (stats == nullptr) return;
+    for (std::size_t i = 0; i < std::size(kVfStatsFields); ++i) stats->*kVfStatsFields[i] = vf.counters[i];
 }
 
 std::vector<Gantry::Network::PortGroup*> NetworkInfoImpl::GetAllPortGroups() {

@@ -1,8 +1,13 @@
 #include "trellis/network/PortsetImpl.h"
 
+#include <set>
 #include <utility>
 
 #include "SwitchStore.h"
+#include "gantry/lib/GantryException.h"
+#include "host/StoredText.h"
+#include "trellis/host/records/PortRecord.h"
+#include "trellis/host/records/SwitchRecords.h"
 #include "trellis/host/Operation.h"
 #include "trellis/network/PortImpl.h"
 
@@ -18,6 +23,26 @@ const Trellis::Host::Operation kGetUplinks("Portset::GetUplinks");
 const Trellis::Host::Operation kGetClass("Portset::GetClass");
 const Trellis::Host::Operation kIsValidVirtualSwitch("PortsetImpl::IsValidVirtualSwitch");
 const Trellis::Host::Operation kGetPorts("PortsetImpl::GetPorts");
+const Trellis::Host::Operation kGetUplinkVlanStats("PortsetImpl::GetUplinkVlanStats");
+const Trellis::Host::Operation kSetUplinkVlanStatsEnabled("PortsetImpl::SetUplinkVlanStatsEnabled");
+
+// The port of the NIC's uplink on the switch.
+Trellis::Host::PortRecord RequireUplinkPort(Trellis::Host::Transaction const& t, std::string const& vswitch,
+                                            std::string const& nicName) {
+    for (Trellis::Host::PortRecord& port : t.ChildrenOf<Trellis::Host::PortRecord>(vswitch))
+        if (port.clientKind == Trellis::Host::PortClientKind::Uplink && port.clientName == nicName) return port;
+    throw Gantry::Lib::GantryException("Physical NIC " + Trellis::Host::Printable(nicName) + " is no uplink of switch " +
+                                       Trellis::Host::Printable(vswitch));
+}
+
+// The VLANs a switch carries: those of its port groups (a distributed
+// switch has none of its own here), in ascending order, each once.
+std::set<int> VlansOfSwitch(Trellis::Host::Transaction const& t, std::string const& vswitch) {
+    std::set<int> vlans;
+    for (Trellis::Host::PortGroupRecord const& group : t.ChildrenOf<Trellis::Host::PortGroupRecord>(vswitch))
+        vlans.insert(group.vlanId);
+    return vlans;
+}
 }  // namespace
 
 PortsetImpl::PortsetImpl(std::string name, int numPorts, std::vector<std::string> uplinks, std::string className)
@@ -88,6 +113,32 @@ std::vector<PortImpl*> PortsetImpl::GetPorts() {
     std::vector<PortImpl*> ports;
     for (Trellis::Host::PortRecord& record : records) ports.push_back(new PortImpl(std::move(record)));
     return ports;
+}
+
+std::vector<Gantry::Network::VlanStats*> PortsetImpl::GetUplinkVlanStats(std::string nicName) {
+    Trellis::Host::PortRecord port = kGetUplinkVlanStats.Read([&](Trellis::Host::Transaction& t) {
+        EnsureLoaded(t);
+        return RequireUplinkPort(t, name_, nicName);
+    });
+    std::vector<Gantry::Network::VlanStats*> stats;
+    if (!port.vlanStats) return stats;
+    for (Trellis::Host::VlanCounterRecord const& vlan : *port.vlanStats)
+        stats.push_back(new Gantry::Network::VlanStats{vlan.vlanId, vlan.rxPackets, vlan.txPackets});
+    return stats;
+}
+
+void PortsetImpl::SetUplinkVlanStatsEnabled(std::string nicName, bool enabled) {
+    kSetUplinkVlanStatsEnabled.Write([&](Trellis::Host::Transaction& t) {
+        EnsureLoaded(t);
+        Trellis::Host::PortRecord port = RequireUplinkPort(t, name_, nicName);
+        if (!enabled) {
+            port.vlanStats.reset();
+        } else if (!port.vlanStats) {
+            port.vlanStats.emplace();
+            for (int vlan : VlansOfSwitch(t, name_)) port.vlanStats->push_back(Trellis::Host::VlanCounterRecord{vlan, 0, 0});
+        }
+        t.Put(port);
+    });
 }
 
 bool PortsetImpl::IsValidVirtualSwitch(std::string const& name) {

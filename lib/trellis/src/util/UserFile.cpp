@@ -45,7 +45,7 @@ private:
 std::string TooLargeReason(std::size_t limit) {
     constexpr std::size_t kMiB = std::size_t{1} << 20;
     return "it is larger than " +
-           (limit % kMiB == 0 ? std::to_string(limit / kMiB) + " MiB" : std::to_string(limit) + " bytes");
+           (limit != 0 && limit % kMiB == 0 ? std::to_string(limit / kMiB) + " MiB" : std::to_string(limit) + " bytes");
 }
 
 std::string ReadUserFile(const std::string& path, std::size_t limit) {

@@ -8,6 +8,7 @@
 #include "host/description/Section.h"
 #include "trellis/host/Transaction.h"
 #include "trellis/host/records/PnicRecord.h"
+#include "trellis/host/records/WorldRecord.h"
 
 namespace Trellis {
 namespace Host {
@@ -38,6 +39,10 @@ public:
     void AddCopy(HostCopy& copy, Json& value) const override {
         for (PnicRecord nic : nics_) {
             nic.name = copy.Name(PnicRecord::kKind, nic.name);
+            nic.macAddress = copy.Mac(nic.macAddress);
+            if (nic.sriov)
+                for (SriovVfRecord& vf : *nic.sriov)
+                    if (!vf.ownerWorldId.empty()) vf.ownerWorldId = copy.Name(WorldRecord::kKind, vf.ownerWorldId);
             value.push_back(nic.ToJson());
         }
     }

@@ -152,7 +152,7 @@ PortRecord PortRecord::FromJson(const JsonReader& in) {
         record.vlanStats.emplace();
         for (const JsonReader& element : in.Array("vlanStats")) {
             VlanCounterRecord vlan;
-            vlan.vlanId = static_cast<int>(element.Int("vlanId", 1, 4094));
+            vlan.vlanId = static_cast<int>(element.Int("vlanId", 0, 4095));
             if (!record.vlanStats->empty() && record.vlanStats->back().vlanId >= vlan.vlanId)
                 element.Member("vlanId").Fail("expected VLAN ids in ascending order, each once");
             vlan.rxPackets = Counter(element, "rxPackets");
