@@ -59,6 +59,10 @@
 #include "LacpGetStatus.h"
 #include "LacpSetTimeout.h"
 #include "NamespaceTreeBuilder.h"
+#include "NicEepromChange.h"
+#include "NicEepromDump.h"
+#include "NicRegisterDump.h"
+#include "NicSelfTestRun.h"
 #include "PortFilterStatsGet.h"
 #include "PortStatsGet.h"
 #include "VMList.h"
@@ -198,12 +202,16 @@ std::vector<TreeRow> NetworkTree() {
                      "Commands to access pause parameters for a NIC"),
         NamespaceRow("network nic register",
                      "Commands to access registers for a NIC"),
+        CommandRow<NicRegisterDump>("network nic register dump"),
         NamespaceRow("network nic eeprom",
                      "Commands to access EEPROM for a NIC"),
+        CommandRow<NicEepromDump>("network nic eeprom dump"),
+        CommandRow<NicEepromChange>("network nic eeprom change"),
         NamespaceRow("network nic negotiate",
                      "Commands to access negotiation feature on a NIC"),
         NamespaceRow("network nic selftest",
                      "Commands to access self test feature on a NIC"),
+        CommandRow<NicSelfTestRun>("network nic selftest run"),
         NamespaceRow("network nic software",
                      "Commands to access NIC feature software simulation settings"),
         NamespaceRow("network nic ring",
