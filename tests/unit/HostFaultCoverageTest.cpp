@@ -410,6 +410,12 @@ const std::vector<CommandRow>& CommandTable() {
         {"IpSecConfigImpl::CheckIKEConfig", {"network", "ip", "ipsec", "set", "-f", "/nonexistent/ike.conf"}},
         {"IpSecConfigImpl::CopyIKEConfig", IpsecSetOfAGoodFile()},
         {"IpSecConfigImpl::RestartIKEDaemons", IpsecSetOfAGoodFile()},
+        {"NetworkInfoImpl::GetPnicByName", {"network", "nic", "register", "dump", "-n", "pnet0"}},
+        {"Pnic::GetRegisterDump", {"network", "nic", "register", "dump", "-n", "pnet0"}},
+        {"Pnic::GetEepromDump", {"network", "nic", "eeprom", "dump", "-n", "pnet0"}},
+        {"Pnic::SetEepromValue", {"network", "nic", "eeprom", "change", "-n", "pnet0", "-m", "284917894", "-o", "0", "-v", "0"}},
+        {"Pnic::SetEepromFromFile", {"network", "nic", "eeprom", "change", "-n", "pnet0", "-m", "284917894", "-f", "/nonexistent"}},
+        {"Pnic::RunSelfTest", {"network", "nic", "selftest", "run", "-n", "pnet0"}},
     };
     return rows;
 }
@@ -423,9 +429,6 @@ std::function<std::string()> Thrown(std::function<void()> call) {
 // command that reaches its operation is built.
 const std::vector<DirectRow>& DirectTable() {
     static const std::vector<DirectRow> rows = {
-        {"NetworkInfoImpl::GetPnicByName", Thrown([] {
-             std::unique_ptr<Gantry::Network::Pnic>(Trellis::Network::NetworkInfoImpl().GetPnicByName("pnet0"));
-         })},
         // dns server remove declares --server required, so the tool refuses --all
         // alone, which is the only way to this operation.
         {"DnsConfigImpl::RemoveNameServers",
