@@ -59,10 +59,19 @@
 #include "LacpGetStatus.h"
 #include "LacpSetTimeout.h"
 #include "NamespaceTreeBuilder.h"
+#include "NicDown.h"
 #include "NicEepromChange.h"
 #include "NicEepromDump.h"
+#include "NicGet.h"
+#include "NicList.h"
+#include "NicNegotiationRestart.h"
 #include "NicRegisterDump.h"
 #include "NicSelfTestRun.h"
+#include "NicSet.h"
+#include "NicStatsGet.h"
+#include "NicUp.h"
+#include "NicVlanStatsGet.h"
+#include "NicVlanStatsSet.h"
 #include "PortFilterStatsGet.h"
 #include "PortStatsGet.h"
 #include "VMList.h"
@@ -184,12 +193,20 @@ std::vector<TreeRow> NetworkTree() {
         CommandRow<IpNetstackInstanceSet>("network ip netstack set"),
         NamespaceRow("network nic",
                      "Operations having to do with the configuration of Network Interface Card and getting and updating the NIC settings."),
+        CommandRow<NicList>("network nic list"),
+        CommandRow<NicUp>("network nic up"),
+        CommandRow<NicGet>("network nic get"),
+        CommandRow<NicSet>("network nic set"),
+        CommandRow<NicDown>("network nic down"),
         NamespaceRow("network nic stats",
                      "Get packet statistics for a NIC"),
+        CommandRow<NicStatsGet>("network nic stats get"),
         NamespaceRow("network nic vlan",
                      "Get VLAN information for a NIC"),
         NamespaceRow("network nic vlan stats",
                      "Commands to access VLAN statistics for a NIC"),
+        CommandRow<NicVlanStatsGet>("network nic vlan stats get"),
+        CommandRow<NicVlanStatsSet>("network nic vlan stats set"),
         NamespaceRow("network nic coalesce",
                      "Commands to access coalesce paramaters for a NIC"),
         NamespaceRow("network nic cso",
@@ -209,6 +226,7 @@ std::vector<TreeRow> NetworkTree() {
         CommandRow<NicEepromChange>("network nic eeprom change"),
         NamespaceRow("network nic negotiate",
                      "Commands to access negotiation feature on a NIC"),
+        CommandRow<NicNegotiationRestart>("network nic negotiate restart"),
         NamespaceRow("network nic selftest",
                      "Commands to access self test feature on a NIC"),
         CommandRow<NicSelfTestRun>("network nic selftest run"),
