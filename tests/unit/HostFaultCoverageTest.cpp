@@ -94,6 +94,8 @@ const Words kRoute4List = {"network", "ip", "route", "ipv4", "list"};
 const Words kRoute4RemoveDefault = {"network", "ip", "route", "ipv4", "remove", "-n", "default", "-g", "192.0.2.1"};
 const Words kRoute6RemoveDefault = {"network", "ip", "route", "ipv6", "remove", "-n", "default", "-g", "2001:db8::1"};
 const Words kNeighborList = {"network", "ip", "neighbor", "list"};
+const Words kNicList = {"network", "nic", "list"};
+const Words kNicGet = {"network", "nic", "get", "-n", "pnet0"};
 
 // The netstack of live migration, in the kernel.
 std::string WithGlideNetstack() {
@@ -416,6 +418,28 @@ const std::vector<CommandRow>& CommandTable() {
         {"Pnic::SetEepromValue", {"network", "nic", "eeprom", "change", "-n", "pnet0", "-m", "284917894", "-o", "0", "-v", "0"}},
         {"Pnic::SetEepromFromFile", {"network", "nic", "eeprom", "change", "-n", "pnet0", "-m", "284917894", "-f", "/nonexistent"}},
         {"Pnic::RunSelfTest", {"network", "nic", "selftest", "run", "-n", "pnet0"}},
+        {"Pnic::GetPciDevice", kNicList},
+        {"PciDevice::GetAddressString", kNicList},
+        {"PciDevice::GetVendorName", kNicList},
+        {"PciDevice::GetDeviceName", kNicList},
+        {"Pnic::GetDriverName", kNicList},
+        {"Pnic::IsLinkUp", kNicList},
+        {"Pnic::IsAdminUp", kNicList},
+        {"Pnic::IsLinkStatusUp", kNicList},
+        {"Pnic::GetSpeed", kNicList},
+        {"Pnic::GetDuplex", kNicList},
+        {"Pnic::GetMacAddress", kNicList},
+        {"Pnic::GetMtu", kNicList},
+        {"Pnic::GetPnicInfo", kNicGet},
+        {"Pnic::GetPauseParams", kNicGet},
+        {"Pnic::GetDriverInfo", kNicGet},
+        {"Pnic::SetAdminUp", {"network", "nic", "down", "-n", "pnet0"}},
+        {"Pnic::SetPnicInfo", {"network", "nic", "set", "-n", "pnet0", "-p", "fibre"}},
+        {"Pnic::SetSpeedDuplex", {"network", "nic", "set", "-n", "pnet0", "-a"}},
+        {"Pnic::RestartNegotiation", {"network", "nic", "negotiate", "restart", "-n", "pnet0"}},
+        {"PnicImpl::GetPnicStats", {"network", "nic", "stats", "get", "-n", "pnet0"}},
+        {"PortsetImpl::GetUplinkVlanStats", {"network", "nic", "vlan", "stats", "get", "-n", "pnet0"}},
+        {"PortsetImpl::SetUplinkVlanStatsEnabled", {"network", "nic", "vlan", "stats", "set", "-n", "pnet0", "-e", "false"}},
     };
     return rows;
 }
