@@ -27,6 +27,9 @@ one_object=(
   "network vswitch dvs korvex list -v dvSwitch0"
   "network vswitch dvs korvex lacp status get -s dvSwitch0"
   "network vswitch dvs korvex lacp timeout set -t false -l 1 -s dvSwitch0"
+  "network nic get -n pnet0"
+  "network nic set -n pnet0 -P 3"
+  "network nic vlan stats get -n pnet0"
 )
 lists=(
   "network firewall ruleset list"
@@ -36,6 +39,7 @@ lists=(
   "network vswitch standard portgroup list"
   "network vswitch dvs korvex list"
   "network vm list"
+  "network nic list"
 )
 
 # Each command runs on the scaled host paired with a run on the default host.
