@@ -59,23 +59,41 @@
 #include "LacpGetStatus.h"
 #include "LacpSetTimeout.h"
 #include "NamespaceTreeBuilder.h"
+#include "NicCoalesceGet.h"
+#include "NicCoalesceSet.h"
+#include "NicCsoGet.h"
+#include "NicCsoSet.h"
 #include "NicDown.h"
 #include "NicEepromChange.h"
 #include "NicEepromDump.h"
 #include "NicGet.h"
 #include "NicList.h"
 #include "NicNegotiationRestart.h"
+#include "NicPauseParamsList.h"
+#include "NicPauseParamsSet.h"
 #include "NicRegisterDump.h"
+#include "NicRingCurrentGet.h"
+#include "NicRingCurrentSet.h"
+#include "NicRingPresetGet.h"
 #include "NicSelfTestRun.h"
 #include "NicSet.h"
+#include "NicSgGet.h"
+#include "NicSgSet.h"
+#include "NicSoftwareList.h"
+#include "NicSoftwareSet.h"
 #include "NicStatsGet.h"
+#include "NicTsoGet.h"
+#include "NicTsoSet.h"
 #include "NicUp.h"
 #include "NicVlanStatsGet.h"
 #include "NicVlanStatsSet.h"
 #include "PortFilterStatsGet.h"
 #include "PortStatsGet.h"
+#include "SriovNicList.h"
 #include "VMList.h"
 #include "VMPortList.h"
+#include "VfList.h"
+#include "VfStats.h"
 #include "VirtualSwitchDVSKorvexList.h"
 #include "VirtualSwitchPortGroupAdd.h"
 #include "VirtualSwitchPortGroupList.h"
@@ -209,14 +227,24 @@ std::vector<TreeRow> NetworkTree() {
         CommandRow<NicVlanStatsSet>("network nic vlan stats set"),
         NamespaceRow("network nic coalesce",
                      "Commands to access coalesce paramaters for a NIC"),
+        CommandRow<NicCoalesceGet>("network nic coalesce get"),
+        CommandRow<NicCoalesceSet>("network nic coalesce set"),
         NamespaceRow("network nic cso",
                      "Commands to access checksum offload settings for a NIC"),
+        CommandRow<NicCsoGet>("network nic cso get"),
+        CommandRow<NicCsoSet>("network nic cso set"),
         NamespaceRow("network nic tso",
                      "Commands to access TCP segmentation offload settings for a NIC"),
+        CommandRow<NicTsoGet>("network nic tso get"),
+        CommandRow<NicTsoSet>("network nic tso set"),
         NamespaceRow("network nic sg",
                      "Commands to access scatter-gather settings for a NIC"),
+        CommandRow<NicSgGet>("network nic sg get"),
+        CommandRow<NicSgSet>("network nic sg set"),
         NamespaceRow("network nic pauseParams",
                      "Commands to access pause parameters for a NIC"),
+        CommandRow<NicPauseParamsList>("network nic pauseParams list"),
+        CommandRow<NicPauseParamsSet>("network nic pauseParams set"),
         NamespaceRow("network nic register",
                      "Commands to access registers for a NIC"),
         CommandRow<NicRegisterDump>("network nic register dump"),
@@ -232,16 +260,24 @@ std::vector<TreeRow> NetworkTree() {
         CommandRow<NicSelfTestRun>("network nic selftest run"),
         NamespaceRow("network nic software",
                      "Commands to access NIC feature software simulation settings"),
+        CommandRow<NicSoftwareList>("network nic software list"),
+        CommandRow<NicSoftwareSet>("network nic software set"),
         NamespaceRow("network nic ring",
                      "Commands to access NIC RX/TX ring buffer parameters"),
         NamespaceRow("network nic ring preset",
                      "Commands to access preset NIC RX/TX ring buffer parameters"),
+        CommandRow<NicRingPresetGet>("network nic ring preset get"),
         NamespaceRow("network nic ring current",
                      "Commands to access current NIC RX/TX ring buffer parameters"),
+        CommandRow<NicRingCurrentGet>("network nic ring current get"),
+        CommandRow<NicRingCurrentSet>("network nic ring current set"),
         NamespaceRow("network sriovnic",
                      "Operations having to do with the configuration of SRIOV enabled Network Interface Card and getting and updating the NIC settings."),
+        CommandRow<SriovNicList>("network sriovnic list"),
         NamespaceRow("network sriovnic vf",
                      "Operations related to VFs of a SRIOV capable pNIC"),
+        CommandRow<VfList>("network sriovnic vf list"),
+        CommandRow<VfStats>("network sriovnic vf stats"),
         NamespaceRow("network vswitch",
                      "Commands to list and manipulate Virtual Switches on an Halden host."),
         NamespaceRow("network vswitch standard",
