@@ -25,7 +25,8 @@ const std::string kAdaptiveRx = "Adaptive RX";
 const std::string kAdaptiveTx = "Adaptive TX";
 const std::string kSampleInterval = "Sample interval seconds";
 
-std::string OnOff(bool enabled) { return enabled ? "On" : "Off"; }
+// Capitalised, unlike the offloads' "on" and "off".
+std::string AdaptiveState(bool enabled) { return enabled ? "On" : "Off"; }
 
 }  // namespace
 
@@ -68,8 +69,8 @@ void NicCoalesceGet::ExecuteInternal(boost::shared_ptr<Input> input, boost::shar
             entry->SetField(kTxUsecs, std::to_string(coalesce.txUsecs));
             entry->SetField(kTxMaxFrames, std::to_string(coalesce.txMaxFrames));
             entry->SetField(kSampleInterval, std::to_string(coalesce.sampleInterval));
-            entry->SetField(kAdaptiveRx, OnOff(coalesce.adaptiveRx));
-            entry->SetField(kAdaptiveTx, OnOff(coalesce.adaptiveTx));
+            entry->SetField(kAdaptiveRx, AdaptiveState(coalesce.adaptiveRx));
+            entry->SetField(kAdaptiveTx, AdaptiveState(coalesce.adaptiveTx));
             result->AddMetaStruct(entry);
         }
         output->SetResult(result);

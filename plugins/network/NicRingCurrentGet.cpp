@@ -28,7 +28,9 @@ NicRingCurrentGet::NicRingCurrentGet() {
 
 boost::shared_ptr<InputSpec> NicRingCurrentGet::GetInputSpecInternal() { return InputSpecOf(kNicName); }
 
-boost::shared_ptr<OutputSpec> NicRingCurrentGet::GetOutputSpecInternal() { return OutputSpec::Of(GetOutputStructure()); }
+boost::shared_ptr<OutputSpec> NicRingCurrentGet::GetOutputSpecInternal() {
+    return OutputSpec::Of(GetOutputStructure());
+}
 
 boost::shared_ptr<MetaStruct> NicRingCurrentGet::GetOutputStructure() {
     boost::shared_ptr<MetaStruct> result = MetaStruct::New("RingInfo");

@@ -15,7 +15,8 @@ SriovNicList::SriovNicList() {
         "This command will list the SRIOV Enabled NICs (PFs) currently installed and loaded on the system.");
     SetMetaDataField("type", "fetcher");
     SetDefaultOutputFormatter("table");
-    SetDefaultOutputParameter("fields:SriovNic", "Name,PCI Device,Driver,Link,Speed,Duplex,MAC Address,MTU,Description");
+    SetDefaultOutputParameter("fields:SriovNic",
+                              "Name,PCI Device,Driver,Link,Speed,Duplex,MAC Address,MTU,Description");
 }
 
 boost::shared_ptr<InputSpec> SriovNicList::GetInputSpecInternal() { return InputSpec::New(); }
