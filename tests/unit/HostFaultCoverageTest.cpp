@@ -22,7 +22,6 @@
 #include "trellis/host/Faults.h"
 #include "trellis/host/Operation.h"
 #include "trellis/network/DnsConfigImpl.h"
-#include "trellis/network/NetworkInfoImpl.h"
 #include "trellis/network/PnicImpl.h"
 #include "trellis/network/PortImpl.h"
 #include "trellis/util/Exec.h"
@@ -440,6 +439,19 @@ const std::vector<CommandRow>& CommandTable() {
         {"PnicImpl::GetPnicStats", {"network", "nic", "stats", "get", "-n", "pnet0"}},
         {"PortsetImpl::GetUplinkVlanStats", {"network", "nic", "vlan", "stats", "get", "-n", "pnet0"}},
         {"PortsetImpl::SetUplinkVlanStatsEnabled", {"network", "nic", "vlan", "stats", "set", "-n", "pnet0", "-e", "false"}},
+        {"Pnic::GetOffloadParams", {"network", "nic", "cso", "get"}},
+        {"Pnic::SetOffloadParams", {"network", "nic", "sg", "set", "-n", "pnet0", "-e", "0"}},
+        {"Pnic::GetCoalesceParams", {"network", "nic", "coalesce", "get"}},
+        {"Pnic::SetCoalesceParams", {"network", "nic", "coalesce", "set", "-n", "pnet0", "-t", "64"}},
+        {"Pnic::SetPauseParams", {"network", "nic", "pauseParams", "set", "-n", "pnet0", "-r", "false"}},
+        {"Pnic::GetRingParams", {"network", "nic", "ring", "current", "get", "-n", "pnet0"}},
+        {"Pnic::SetRingParams", {"network", "nic", "ring", "current", "set", "-n", "pnet0", "-t", "1024"}},
+        {"Pnic::GetSoftwareParams", {"network", "nic", "software", "list"}},
+        {"Pnic::SetSoftwareParams", {"network", "nic", "software", "set", "-n", "pnet0", "--sg", "true"}},
+        {"NetworkInfoImpl::GetSriovNics", {"network", "sriovnic", "list"}},
+        {"NetworkInfoImpl::GetSriovNicByName", {"network", "sriovnic", "vf", "list", "-n", "pnet1"}},
+        {"NetworkInfoImpl::GetSriovNicVFInfo", {"network", "sriovnic", "vf", "list", "-n", "pnet1"}},
+        {"NetworkInfoImpl::GetSriovNicVFStats", {"network", "sriovnic", "vf", "stats", "-n", "pnet1", "-v", "0"}},
     };
     return rows;
 }
