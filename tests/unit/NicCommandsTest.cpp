@@ -128,6 +128,15 @@ TEST(NicGet, ShowsWhatANicLacksDistinctFromWhatIsOff) {
         "Driver Info":{"Driver":"hvnet","Version":"1.0.0","Firmware Version":"N/A","Bus Info":"N/A"}})");
 }
 
+TEST(NicGet, ALinkModeOfADuplexTheDeviceCannotTellEndsAtTheSlash) {
+    TempHost host([](Json& d) {
+        Json mode = {{"speed", 100}, {"duplex", "unknown"}};
+        d["nics"][2]["link"]["supportedModes"].push_back(mode);
+        d["nics"][2]["link"]["advertisedModes"] = Json::array({mode});
+    });
+    EXPECT_EQ(Got("pnet2")["Advertised Link Modes"], Json::array({"100baseT/"}));
+}
+
 TEST(NicGet, NamesEveryWakeOnValue) {
     TempHost host([](Json& d) { d["nics"][1]["wakeOn"] = {{"supported", "pumbags"}, {"enabled", "pumbags"}}; });
     EXPECT_EQ(Got("pnet1")["Wakeon"], Json::parse(R"j(["PHY Activity","Unicast Messagess","Multicast Messages",

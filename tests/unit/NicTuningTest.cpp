@@ -336,3 +336,12 @@ TEST(NicTuning, EachCommandReportsAHostFailureInItsOwnWords) {
     ArmFault({"NetworkInfoImpl::NetworkInfoImpl", "no inventory", 0, 1});
     EXPECT_THROW(RunCommand<NicCsoGet>(), Gantry::Lib::GantryException);
 }
+
+// Both lists are joined from the tables their commands share with their
+// parameters and fields; the columns must still read so, in this order.
+TEST(NicTuning, JoinedFieldListsReadAsTheColumnsUsersSee) {
+    EXPECT_EQ(NicCoalesceGet::New()->GetDefaultOutputFormatParameters()["fields:CoalesceParams"],
+              "NIC,RX microseconds,RX maximum frames,TX microseconds,TX Maximum frames,Adaptive RX,Adaptive TX,Sample interval seconds");
+    EXPECT_EQ(NicSoftwareList::New()->GetDefaultOutputFormatParameters()["fields:Settings"],
+              "NIC,IPv4 CSO,IPv4 TSO,Scatter Gather,Offset Based Offload,VXLAN Encap,Geneve Offload,IPv6 TSO,IPv6 TSO Ext,IPv6 CSO,IPv6 CSO Ext,High DMA,Scatter Gather MP,VLAN Tagging,VLAN Untagging");
+}

@@ -95,7 +95,7 @@ std::vector<PnicLinkModeRecord> ReadModes(const JsonReader& in, const char* key)
         PnicLinkModeRecord mode;
         mode.speed = static_cast<unsigned int>(element.Int("speed", 1, kMaxSpeed));
         mode.duplex = element.Word<PnicDuplex>("duplex", kPnicDuplexWords);
-        if (mode.duplex == PnicDuplex::Auto) element.Member("duplex").Fail("expected \"full\" or \"half\"");
+        if (mode.duplex == PnicDuplex::Auto) element.Member("duplex").Fail("expected \"full\", \"half\" or \"unknown\"");
         element.RejectUnknownMembers();
         modes.push_back(mode);
     }

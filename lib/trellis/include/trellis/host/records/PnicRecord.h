@@ -11,9 +11,10 @@
 namespace Trellis {
 namespace Host {
 
-// Duplex of a link; the values are the host's (0 auto, 1 full, 2 half).
-enum class PnicDuplex { Auto, Full, Half };
-inline constexpr const char* kPnicDuplexWords[] = {"auto", "full", "half"};
+// Duplex of a link; the values are the host's (0 auto, 1 full, 2 half), and a
+// device may report one it cannot tell (3).
+enum class PnicDuplex { Auto, Full, Half, Unknown };
+inline constexpr const char* kPnicDuplexWords[] = {"auto", "full", "half", "unknown"};
 
 // Port types by their values (0 TP ... 5 DA); "other" is a port the tools do
 // not name.
