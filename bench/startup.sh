@@ -1,7 +1,7 @@
 #!/usr/bin/env bash
 # What each command costs, start-up included, against the floor: a C++
-# program that loads one shared library and calls one function. Every
-# command of the tree runs on the default host, each run paired with a run of
+# program that loads one shared library and calls one function. Commands of
+# every family of the tree run on the default host, each run paired with a run of
 # the floor just before it; the goal is at most 1.5 times the floor's wall
 # time for every command.
 #
@@ -63,6 +63,27 @@ $c network vm list
 $c network vm port list -w 69312
 $c network port stats get -p 33554437
 $c network port filter stats get -p 33554437
+$c network ip get
+$c network ip dns server list
+$c network ip connection list
+$c network ip ipsec sa list
+$c network ip interface list
+$c network ip interface ipv4 get -i tsl0
+$c network ip interface set -i tsl0 -m 1500
+$c network ip netstack list
+$c network ip route ipv4 list
+$c network ip neighbor list
+$c network nic list
+$c network nic get -n pnet0
+$c network nic set -n pnet0 -P 3
+$c network nic set -n pnet0 -P 1
+$c network nic stats get -n pnet0
+$c network nic vlan stats get -n pnet0
+$c network nic eeprom dump -n pnet0
+$c network nic coalesce get
+$c network nic software list
+$c network nic ring current get -n pnet0
+$c network sriovnic vf list -n pnet1
 $c network firewall unload
 $c network firewall load
 LINES

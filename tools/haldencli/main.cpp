@@ -1,4 +1,5 @@
 // haldencli: loads the plug-ins and hands the command line to the framework.
+#include <cstdlib>
 #include <iostream>
 #include <string>
 #include <vector>
@@ -29,5 +30,12 @@ int main(int argc, char** argv) {
     tool.SetHostHold(Trellis::Host::HoldHost, Trellis::Host::ReleaseHost);
     int const status = tool.Run(std::vector<std::string>(argv + 1, argv + argc), std::cout, std::cerr);
     std::cout.flush();
+#ifndef __SANITIZE_ADDRESS__
+    // Every change of the call was committed when its operation returned, so
+    // the end of the process gives back what it holds: the tree, the plug-in
+    // and the libraries' objects are not taken apart one by one. A sanitized
+    // build does take them apart, so that its leak check sees every object.
+    std::_Exit(status);
+#endif
     return status;
 }

@@ -40,7 +40,10 @@ std::vector<std::string> PluginFiles(std::string const& defaultDirectory) {
 
 void LoadPlugins(std::vector<std::string> const& files, boost::shared_ptr<AutoCli::NamespaceNode> root) {
     for (std::string const& file : files) {
-        void* handle = dlopen(file.c_str(), RTLD_NOW | RTLD_LOCAL);
+        // Functions are bound on first call: a command uses a few dozen of the
+        // hundreds a plug-in names, and binding them all at load was a
+        // measurable part of every start.
+        void* handle = dlopen(file.c_str(), RTLD_LAZY | RTLD_LOCAL);
         if (!handle) throw PluginLoadError("Cannot load the plug-in " + file + ": " + dlerror());
         dlerror();
         void* symbol = dlsym(handle, PLINTH_PLUGIN_ENTRY_SYMBOL);

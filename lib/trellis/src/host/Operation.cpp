@@ -1,6 +1,6 @@
 #include "trellis/host/Operation.h"
 
-#include <map>
+#include <algorithm>
 #include <stdexcept>
 
 #include "host/Store.h"
@@ -10,10 +10,19 @@ namespace Host {
 
 namespace {
 
-// Filled while the libraries load, by the constructors of the Operation constants.
-std::map<std::string, FaultKind>& Registry() {
-    static std::map<std::string, FaultKind> registry;
+// Filled while the libraries load, by the constructors of the Operation
+// constants, which live as long as the process. Kept as it comes, as that
+// costs every start of the tool least; it is searched only when a fault is
+// armed or the names are listed.
+std::vector<const Operation*>& Registry() {
+    static std::vector<const Operation*> registry;
     return registry;
+}
+
+const Operation* Find(const std::string& name) {
+    for (const Operation* operation : Registry())
+        if (operation->Name() == name) return operation;
+    return nullptr;
 }
 
 Store& StoreOutsideTransaction(const std::string& operation) {
@@ -31,7 +40,7 @@ std::optional<Fault> HitFault(Store& store, const std::string& operation) {
 }  // namespace
 
 Operation::Operation(std::string name, FaultKind kind) : name_(std::move(name)), kind_(kind) {
-    Registry().emplace(name_, kind_);
+    Registry().push_back(this);
 }
 
 void Operation::Check() const {
@@ -52,17 +61,19 @@ TransactionScope Operation::Begin(bool write) const {
     return TransactionScope(CurrentStore(), write);
 }
 
-bool Operation::IsKnown(const std::string& name) {
-    return Registry().count(name) > 0;
-}
+bool Operation::IsKnown(const std::string& name) { return Find(name) != nullptr; }
 
 FaultKind Operation::KindOf(const std::string& name) {
-    return Registry().at(name);
+    const Operation* operation = Find(name);
+    if (operation == nullptr) throw std::out_of_range("Unknown host operation " + name);
+    return operation->kind_;
 }
 
 std::vector<std::string> Operation::KnownNames() {
     std::vector<std::string> names;
-    for (const auto& entry : Registry()) names.push_back(entry.first);
+    for (const Operation* operation : Registry()) names.push_back(operation->Name());
+    std::sort(names.begin(), names.end());
+    names.erase(std::unique(names.begin(), names.end()), names.end());
     return names;
 }
 

@@ -63,6 +63,9 @@ public:
         return Run(true, std::forward<Fn>(fn));
     }
 
+    // "Class::Operation".
+    const std::string& Name() const { return name_; }
+
     // For a FaultKind::Status operation: the status of the fault armed for it
     // (counting the hit down), or 0 when none is armed.
     int FaultStatus() const;
