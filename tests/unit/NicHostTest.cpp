@@ -4,6 +4,7 @@
 // the NIC command tests.
 
 #include <sys/stat.h>
+#include <unistd.h>
 
 #include <fstream>
 #include <memory>
@@ -33,7 +34,7 @@ Gantry::Network::PnicInfo InfoOf(const std::string& nic) {
 }
 
 std::string WriteFile(const std::string& name, const std::string& content) {
-    const std::string path = ::testing::TempDir() + name;
+    const std::string path = ::testing::TempDir() + name + "." + std::to_string(::getpid());
     std::ofstream(path, std::ios::binary) << content;
     return path;
 }
@@ -153,7 +154,7 @@ TEST(NicHost, EepromReadsWithinItsBytesAndWritesOnlyWithTheMagic) {
     // The magic is checked before the file is looked at.
     EXPECT_EQ(FailureOf([&] { pnet0.SetEepromFromFile(1, "/nonexistent"); }),
               "Invalid EEPROM magic 0x1 for physical NIC pnet0");
-    const std::string fifo = ::testing::TempDir() + "eeprom.fifo";
+    const std::string fifo = ::testing::TempDir() + "eeprom.fifo." + std::to_string(::getpid());
     ::unlink(fifo.c_str());
     ASSERT_EQ(::mkfifo(fifo.c_str(), 0600), 0);
     EXPECT_EQ(FailureOf([&] { pnet0.SetEepromFromFile(0x10fb8086, fifo); }),

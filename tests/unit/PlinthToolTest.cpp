@@ -68,7 +68,8 @@ void NameOrFailure(Input& input, Output& output) {
 }
 
 std::string BatchFile(std::string const& text) {
-    std::string const path = ::testing::TempDir() + "/plinth-batch.txt";
+    // Of this process alone: CTest runs the tests of this file side by side.
+    std::string const path = ::testing::TempDir() + "/plinth-batch." + std::to_string(::getpid()) + ".txt";
     std::ofstream(path, std::ios::binary) << text;
     return path;
 }
