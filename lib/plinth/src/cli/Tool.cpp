@@ -125,6 +125,15 @@ int Tool::WriteCompletion(GlobalOptions const& options, std::ostream& out, std::
     source.programName = programName_;
     source.formatters = FormatterNames();
     source.hostNameParameters = hostNameParameters_;
+    // The options of a few commands come from the host; as for their help,
+    // the host is opened then.
+    source.inputSpecOf = [&](Command& command) -> boost::shared_ptr<InputSpec> {
+        try {
+            return InputSpecOf(command, options);
+        } catch (...) {
+            return nullptr;
+        }
+    };
     try {
         out << CompletionScript(options.completion, *root_, source);
     } catch (UsageError const& refusal) {
