@@ -1,5 +1,7 @@
 // haldencli: loads the plug-ins and hands the command line to the framework.
 #include <cstdlib>
+#include <filesystem>
+#include <map>
 #include <iostream>
 #include <string>
 #include <vector>
@@ -8,11 +10,37 @@
 #include "plinth/cli/PluginLoader.h"
 #include "plinth/cli/Tool.h"
 #include "trellis/host/HostSession.h"
+#include "trellis/host/ObjectNames.h"
 
 namespace {
 
 void OpenHost(std::string const& hostOption) {
     Trellis::Host::OpenHost(Trellis::Host::ResolveHostPath(hostOption));
+}
+
+// The parameters whose values name host objects, and the kind they name.
+std::map<std::string, Trellis::Host::ObjectKind> const& HostNameParameters() {
+    using Trellis::Host::ObjectKind;
+    static std::map<std::string, ObjectKind> const parameters = {
+        {"vswitch-name", ObjectKind::StandardSwitch},     {"portgroup-name", ObjectKind::PortGroup},
+        {"nic-name", ObjectKind::PhysicalNic},            {"pnet", ObjectKind::PhysicalNic},
+        {"uplink-name", ObjectKind::PhysicalNic},         {"interface-name", ObjectKind::KernelInterface},
+        {"ruleset-id", ObjectKind::FirewallRuleset},      {"netstack", ObjectKind::Netstack},
+        {"vds-name", ObjectKind::DistributedSwitch},      {"vds", ObjectKind::DistributedSwitch},
+    };
+    return parameters;
+}
+
+// For completion: the names on the host as it is. A host that does not exist
+// is not created for it, and no host operation runs.
+std::vector<std::string> HostNames(std::string const& parameter, std::string const& hostOption) {
+    auto const kind = HostNameParameters().find(parameter);
+    if (kind == HostNameParameters().end()) return {};
+    std::string const path = Trellis::Host::ResolveHostPath(hostOption);
+    std::error_code error;
+    if (!std::filesystem::is_regular_file(path, error)) return {};
+    Trellis::Host::OpenHost(path);
+    return Trellis::Host::ObjectNames(kind->second);
 }
 
 }  // namespace
@@ -28,6 +56,9 @@ int main(int argc, char** argv) {
     }
     Plinth::Cli::Tool tool(root, "haldencli", OpenHost);
     tool.SetHostHold(Trellis::Host::HoldHost, Trellis::Host::ReleaseHost);
+    std::vector<std::string> hostNameParameters;
+    for (auto const& parameter : HostNameParameters()) hostNameParameters.push_back(parameter.first);
+    tool.SetHostNames(hostNameParameters, HostNames);
     int const status = tool.Run(std::vector<std::string>(argv + 1, argv + argc), std::cout, std::cerr);
     std::cout.flush();
 #ifndef __SANITIZE_ADDRESS__

@@ -29,6 +29,17 @@ bool ReadValueOption(std::string const& name, std::vector<std::string> const& wo
     return true;
 }
 
+// A completion entry prints what the shell needs and runs nothing else.
+void CheckCompletionOptions(GlobalOptions const& options) {
+    int const entries = !options.batch.empty() + !options.completion.empty() + !options.completeNames.empty();
+    if (entries > 1) throw UsageError("Options --batch, --completion and --complete-names exclude each other.");
+    std::string const entry = !options.completion.empty() ? "--completion" : "--complete-names";
+    if ((!options.completion.empty() || !options.completeNames.empty()) && !options.commandWords.empty()) {
+        throw UsageError("Unexpected argument '" + VisibleText(options.commandWords.front()) + "': " + entry +
+                         " takes no command path.");
+    }
+}
+
 // The command lines of a batch come from its lines, each with its own
 // formatter.
 void CheckBatchOptions(GlobalOptions const& options) {
@@ -52,6 +63,8 @@ GlobalOptions ParseGlobalOptions(std::vector<std::string> const& words) {
     bool hostSeen = false;
     bool formatterSeen = false;
     bool batchSeen = false;
+    bool completionSeen = false;
+    bool completeNamesSeen = false;
     size_t i = 0;
     for (; i < words.size() && !words[i].empty() && words[i][0] == '-'; ++i) {
         if (words[i] == "--help") {
@@ -61,11 +74,14 @@ GlobalOptions ParseGlobalOptions(std::vector<std::string> const& words) {
             options.force = true;
         } else if (!ReadValueOption("host", words, i, options.host, hostSeen) &&
                    !ReadValueOption("formatter", words, i, options.formatter, formatterSeen) &&
-                   !ReadValueOption("batch", words, i, options.batch, batchSeen)) {
+                   !ReadValueOption("batch", words, i, options.batch, batchSeen) &&
+                   !ReadValueOption("completion", words, i, options.completion, completionSeen) &&
+                   !ReadValueOption("complete-names", words, i, options.completeNames, completeNamesSeen)) {
             throw UsageError("Unknown option " + VisibleText(words[i]) + ".");
         }
     }
     options.commandWords.assign(words.begin() + static_cast<long>(i), words.end());
+    CheckCompletionOptions(options);
     CheckBatchOptions(options);
     return options;
 }

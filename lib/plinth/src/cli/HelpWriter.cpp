@@ -70,6 +70,8 @@ std::string GlobalOptions() {
                          "Run the command lines of a file (- for standard input), one a line, on one host; "
                          "stop at the first that fails.",
                          2, kOptionColumn, kWidth) +
+           FormatColumns("--completion=<str>",
+                         "Print the completion script of a shell: bash, zsh or fish.", 2, kOptionColumn, kWidth) +
            FormatColumns("--force", "With --batch: run every line, even after one fails.", 2, kOptionColumn,
                          kWidth) +
            FormatColumns("--formatter=<str>",

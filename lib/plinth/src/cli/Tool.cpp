@@ -6,6 +6,7 @@
 
 #include "plinth/cli/Batch.h"
 #include "plinth/cli/BatchLine.h"
+#include "plinth/cli/Completion.h"
 #include "plinth/cli/FormatHints.h"
 #include "plinth/cli/Formatter.h"
 #include "plinth/cli/OptionParser.h"
@@ -100,11 +101,62 @@ int Tool::RunWords(std::vector<std::string> const& words, std::ostream& out, std
         if (!options.host.empty()) {
             throw BatchLineError("--host cannot be given on a line of a batch; give it before --batch");
         }
+        if (!options.completion.empty() || !options.completeNames.empty()) {
+            throw BatchLineError("--completion cannot be given on a line of a batch");
+        }
         options.host = *batchHost;
+    } else if (!options.completion.empty()) {
+        return WriteCompletion(options, out, err);
+    } else if (!options.completeNames.empty()) {
+        return WriteHostNames(options, out);
     } else if (!options.batch.empty() && !options.help) {
         return RunBatchFile(options, out, err);
     }
     return RunPath(options, out, err);
+}
+
+void Tool::SetHostNames(std::vector<std::string> parameters, NameLister lister) {
+    hostNameParameters_ = std::move(parameters);
+    listNames_ = std::move(lister);
+}
+
+int Tool::WriteCompletion(GlobalOptions const& options, std::ostream& out, std::ostream& err) {
+    CompletionSource source;
+    source.programName = programName_;
+    source.formatters = FormatterNames();
+    source.hostNameParameters = hostNameParameters_;
+    // The options of a few commands come from the host; as for their help,
+    // the host is opened then.
+    source.inputSpecOf = [&](Command& command) -> boost::shared_ptr<InputSpec> {
+        try {
+            return InputSpecOf(command, options);
+        } catch (...) {
+            return nullptr;
+        }
+    };
+    try {
+        out << CompletionScript(options.completion, *root_, source);
+    } catch (UsageError const& refusal) {
+        err << "Error: " << refusal.what() << "\n\n" << help_.NamespaceHelp(*root_);
+        return EXIT_REFUSED;
+    }
+    return EXIT_OK;
+}
+
+int Tool::WriteHostNames(GlobalOptions const& options, std::ostream& out) {
+    std::vector<std::string> const& known = hostNameParameters_;
+    if (!listNames_ || std::find(known.begin(), known.end(), options.completeNames) == known.end()) return EXIT_OK;
+    std::vector<std::string> names;
+    try {
+        names = listNames_(options.completeNames, options.host);
+    } catch (...) {
+        // A shell that completes wants names or nothing, never an error.
+        return EXIT_OK;
+    }
+    for (std::string const& name : names) {
+        if (name.find('\n') == std::string::npos) out << name << "\n";
+    }
+    return EXIT_OK;
 }
 
 int Tool::RunBatchFile(GlobalOptions const& options, std::ostream& out, std::ostream& err) {

@@ -29,6 +29,11 @@ public:
     // Opens the host that the --host option names ("" when not given). Any
     // std::exception it throws is a refusal: its text is shown, exit 2.
     typedef std::function<void(std::string const& hostOption)> HostOpener;
+    // The names of the host objects that a parameter names, on the host that
+    // --host names ("" when not given), for completion. It must leave the
+    // host as it is; whatever it throws is taken as no names.
+    typedef std::function<std::vector<std::string>(std::string const& parameter, std::string const& hostOption)>
+        NameLister;
 
     Tool(boost::shared_ptr<AutoCli::NamespaceNode> root, std::string programName, HostOpener openHost);
 
@@ -37,6 +42,10 @@ public:
     // keep the host to the command while it runs. A hold that throws fails
     // the command (status 1) before it runs.
     void SetHostHold(std::function<void()> hold, std::function<void()> release);
+
+    // The parameters whose values completion scripts take from the host
+    // (--complete-names PARAMETER), and how to list them.
+    void SetHostNames(std::vector<std::string> parameters, NameLister lister);
 
     // words: the command line after the program name. Writes the result and
     // help to out, error texts and refusals to err; returns the exit status.
@@ -54,6 +63,10 @@ private:
     int RunWords(std::vector<std::string> const& words, std::ostream& out, std::ostream& err,
                  std::string const* batchHost);
     int RunPath(GlobalOptions const& options, std::ostream& out, std::ostream& err);
+    // --completion SHELL: the completion script of the tree.
+    int WriteCompletion(GlobalOptions const& options, std::ostream& out, std::ostream& err);
+    // --complete-names PARAMETER: one host name a line; never fails.
+    int WriteHostNames(GlobalOptions const& options, std::ostream& out);
     int RunBatchFile(GlobalOptions const& options, std::ostream& out, std::ostream& err);
     int RunCommand(AutoCli::Command& command, GlobalOptions const& options, std::vector<std::string> const& words,
                    std::ostream& out, std::ostream& err);
@@ -70,6 +83,8 @@ private:
     HostOpener openHost_;
     std::function<void()> holdHost_;
     std::function<void()> releaseHost_;
+    std::vector<std::string> hostNameParameters_;
+    NameLister listNames_;
     bool hostOpen_ = false;
 };
 
