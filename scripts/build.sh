@@ -46,22 +46,8 @@ exec 9>"$build/.lock"
 flock 9
 sources_changed || exit 0
 
-packages=(g++ cmake ninja-build pkg-config libboost1.81-dev
-          libsqlite3-dev nlohmann-json3-dev libgtest-dev libbenchmark-dev)
-missing=()
-for p in "${packages[@]}"; do
-  dpkg-query -W -f='${Status}' "$p" 2>/dev/null | grep -q 'ok installed' || missing+=("$p")
-done
-if [ ${#missing[@]} -gt 0 ]; then
-  echo "Installing ${missing[*]}..." >&2
-  sudo=""
-  [ "$(id -u)" -eq 0 ] || sudo="sudo"
-  export DEBIAN_FRONTEND=noninteractive
-  if ! $sudo apt-get install -y -q "${missing[@]}" >&2; then
-    $sudo apt-get update -q >&2
-    $sudo apt-get install -y -q "${missing[@]}" >&2
-  fi
-fi
+"$top/scripts/install-packages.sh" g++ cmake ninja-build pkg-config libboost1.81-dev \
+  libsqlite3-dev nlohmann-json3-dev libgtest-dev libbenchmark-dev
 
 if [ ! -f "$build/CMakeCache.txt" ]; then
   cmake -S "$top" -B "$build" -G Ninja "${cmake_flags[@]}" >&2

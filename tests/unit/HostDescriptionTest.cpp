@@ -113,6 +113,10 @@ TEST(HostDescription, BadDescriptionsAreRefusedWithTheirPathAndChangeNothing) {
               "not valid JSON: parse error at line 2, column 15: syntax error while parsing value - "
               "unexpected '}'; expected '[', '{', or a literal");
     EXPECT_EQ(RefusalOf("[]"), "top level: expected an object");
+    // Found by fuzzing: a number beyond a double's range escaped as the JSON
+    // library's own exception.
+    EXPECT_EQ(RefusalOf("{\"format\": 1, \"nics\": [{\"speed\": 65e18701}]}"),
+              "not valid JSON: number overflow parsing '65e18701'");
     EXPECT_EQ(ExportHost(), before);
 }
 

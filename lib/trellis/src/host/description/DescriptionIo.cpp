@@ -125,6 +125,12 @@ Json ParseDescriptionText(const std::string& text) {
         auto end = message.find("] ");  // drop the library's "[json.exception.parse_error.101] "
         throw DescriptionError("not valid JSON: " +
                                (end == std::string::npos ? message : message.substr(end + 2)));
+    } catch (const nlohmann::json::out_of_range& e) {
+        // A number beyond what a double holds ("1e999").
+        std::string message = e.what();
+        auto end = message.find("] ");
+        throw DescriptionError("not valid JSON: " +
+                               (end == std::string::npos ? message : message.substr(end + 2)));
     }
 }
 
