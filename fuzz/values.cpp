@@ -1,4 +1,4 @@
-// The value types' parsers: any text is either taken or refused with a
+// The value types' parsers and the IPv4 configuration built from them: any text is either taken or refused with a
 // GantryException, and an address taken reads back as a text the same
 // parser takes to the same text; nothing else may happen.
 
@@ -8,6 +8,7 @@
 
 #include "gantry/lib/GantryException.h"
 #include "gantry/network/IpAddress.h"
+#include "gantry/network/IpConfig.h"
 #include "gantry/network/Ipv4Address.h"
 #include "gantry/network/Ipv4Network.h"
 #include "gantry/network/Ipv6Address.h"
@@ -37,6 +38,21 @@ void Parse(std::string const& text) {
     }
 }
 
+// An interface's IPv4 configuration from "address/netmask", as the commands
+// build one from their two options: its broadcast address follows from both.
+void Ipv4Configuration(std::string const& text) {
+    const std::string::size_type slash = text.find('/');
+    if (slash == std::string::npos) return;
+    try {
+        Gantry::Network::IpConfig config;
+        config.SetIpv4Address(Gantry::Network::Ipv4Address(text.substr(0, slash)));
+        config.SetIpv4Netmask(Gantry::Network::Ipv4Address(text.substr(slash + 1)));
+        config.GetIpv4Broadcast().GetStringAddress();
+        Gantry::Network::Ipv4Network::IsValidNetmask(config.GetIpv4Netmask());
+    } catch (Gantry::Lib::GantryException const&) {
+    }
+}
+
 }  // namespace
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
@@ -47,5 +63,6 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
     RoundTrip<Gantry::Network::MacAddress>(text, [](auto& v) { return v.GetStringAddress(); });
     Parse<Gantry::Network::Ipv4Network>(text);
     Parse<Gantry::Network::Ipv6Network>(text);
+    Ipv4Configuration(text);
     return 0;
 }
