@@ -1,6 +1,7 @@
-// The value types' parsers and the IPv4 configuration built from them: any text is either taken or refused with a
-// GantryException, and an address taken reads back as a text the same
-// parser takes to the same text; nothing else may happen.
+// The value types' parsers, and the IPv4 configuration built from them: any
+// text is either taken or refused with a GantryException, and an address
+// taken reads back as a text the same parser takes to the same text;
+// nothing else may happen.
 
 #include <cstddef>
 #include <cstdint>
