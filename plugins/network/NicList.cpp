@@ -1,22 +1,14 @@
 #include "NicList.h"
 
 #include <memory>
-#include <string>
 
 #include "CommandSupport.h"
+#include "NicInventoryRow.h"
 #include "gantry/network/NetworkFactory.h"
 #include "gantry/network/NetworkInfo.h"
-#include "gantry/network/PciDevice.h"
-#include "gantry/network/Pnic.h"
 
 namespace KorvexCli {
 namespace NetworkNamespace {
-
-namespace {
-
-const char* UpOrDown(bool up) { return up ? "Up" : "Down"; }
-
-}  // namespace
 
 NicList::NicList() {
     SetDescription("This command will list the Physical NICs currently installed and loaded on the system.");
@@ -56,25 +48,7 @@ void NicList::ExecuteInternal(boost::shared_ptr<Input> /*input*/, boost::shared_
         for (Gantry::Network::Pnic* pnic : pnics) {
             if (pnic == nullptr) continue;
             boost::shared_ptr<MetaStruct> entry = GetOutputStructure();
-            entry->SetField("Name", pnic->GetName());
-            // A pseudo NIC has no PCI device.
-            std::string address = "Pseudo", vendor = "Unknown", device = "Unknown";
-            std::unique_ptr<Gantry::Network::PciDevice> pciDevice(pnic->GetPciDevice());
-            if (pciDevice) {
-                address = pciDevice->GetAddressString();
-                vendor = pciDevice->GetVendorName();
-                device = pciDevice->GetDeviceName();
-            }
-            entry->SetField("PCI Device", address);
-            entry->SetField("Driver", pnic->GetDriverName());
-            entry->SetField("Link", UpOrDown(pnic->IsLinkUp()));
-            entry->SetField("Admin Status", UpOrDown(pnic->IsAdminUp()));
-            entry->SetField("Link Status", UpOrDown(pnic->IsLinkStatusUp()));
-            entry->SetField("Speed", pnic->GetSpeed());
-            entry->SetField("Duplex", pnic->GetDuplex() == 1 ? "Full" : "Half");
-            entry->SetField("MAC Address", pnic->GetMacAddress().GetStringAddress());
-            entry->SetField("MTU", pnic->GetMtu());
-            entry->SetField("Description", vendor + " " + device);
+            FillNicInventoryRow(*entry, *pnic, true);
             result->AddMetaStruct(entry);
         }
         output->SetResult(result);

@@ -1,10 +1,7 @@
 #include "SriovNicList.h"
 
-#include <memory>
-#include <string>
-
 #include "CommandSupport.h"
-#include "gantry/network/PciDevice.h"
+#include "NicInventoryRow.h"
 #include "trellis/network/NetworkInfoImpl.h"
 
 namespace KorvexCli {
@@ -47,23 +44,7 @@ void SriovNicList::ExecuteInternal(boost::shared_ptr<Input>, boost::shared_ptr<O
         for (Gantry::Network::Pnic* nic : nics) {
             if (!nic) continue;
             boost::shared_ptr<MetaStruct> entry = GetOutputStructure();
-            entry->SetField("Name", nic->GetName());
-            // A NIC without a PCI device is a pseudo NIC.
-            std::string address = "Pseudo", vendor = "Unknown", device = "Unknown";
-            std::unique_ptr<Gantry::Network::PciDevice> pci(nic->GetPciDevice());
-            if (pci) {
-                address = pci->GetAddressString();
-                vendor = pci->GetVendorName();
-                device = pci->GetDeviceName();
-            }
-            entry->SetField("PCI Device", address);
-            entry->SetField("Driver", nic->GetDriverName());
-            entry->SetField("Link", nic->IsLinkUp() ? "Up" : "Down");
-            entry->SetField("Speed", nic->GetSpeed());
-            entry->SetField("Duplex", nic->GetDuplex() == 1 ? "Full" : "Half");
-            entry->SetField("MAC Address", nic->GetMacAddress().GetStringAddress());
-            entry->SetField("MTU", nic->GetMtu());
-            entry->SetField("Description", vendor + " " + device);
+            FillNicInventoryRow(*entry, *nic, false);
             result->AddMetaStruct(entry);
         }
         output->SetResult(result);
