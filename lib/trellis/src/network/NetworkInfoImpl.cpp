@@ -5,6 +5,7 @@
 #include <optional>
 #include <utility>
 
+#include "PnicDevice.h"
 #include "RoutingStore.h"
 #include "gantry/lib/GantryException.h"
 #include "host/StoredText.h"
@@ -70,10 +71,9 @@ const Operation kGetSriovNicVFStats("NetworkInfoImpl::GetSriovNicVFStats");
 
 // The virtual functions of an SR-IOV NIC; refuses any other NIC.
 std::vector<Trellis::Host::SriovVfRecord> RequireVirtualFunctions(Transaction const& t, std::string const& name) {
-    std::optional<PnicRecord> nic = t.Find<PnicRecord>(name);
-    if (!nic) throw Gantry::Lib::GantryException("Physical NIC " + Trellis::Host::Printable(name) + " does not exist");
-    if (!nic->sriov) throw Gantry::Lib::GantryException("Physical NIC " + Trellis::Host::Printable(name) + " has no SR-IOV");
-    return std::move(*nic->sriov);
+    PnicRecord nic = PnicDevice::RequireNic(t, name);
+    if (!nic.sriov) throw Gantry::Lib::GantryException(PnicDevice::Subject(nic) + "has no SR-IOV");
+    return std::move(*nic.sriov);
 }
 
 // Each counter of SriovNicVFStats, in the order of the stored counters.

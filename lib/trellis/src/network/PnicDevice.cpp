@@ -2,6 +2,8 @@
 
 #include <algorithm>
 #include <iterator>
+#include <optional>
+#include <utility>
 
 #include "gantry/lib/GantryException.h"
 #include "host/StoredText.h"
@@ -60,6 +62,12 @@ void ApplyWakeOn(PnicRecord& nic, std::vector<int> const& values) {
 }
 
 }  // namespace
+
+PnicRecord RequireNic(Trellis::Host::Transaction const& t, std::string const& name) {
+    std::optional<PnicRecord> nic = t.Find<PnicRecord>(name);
+    if (!nic) throw GantryException("Physical NIC " + Trellis::Host::Printable(name) + " does not exist");
+    return std::move(*nic);
+}
 
 std::string Subject(PnicRecord const& nic) { return "Physical NIC " + Trellis::Host::Printable(nic.name) + " "; }
 

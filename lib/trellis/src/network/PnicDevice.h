@@ -8,11 +8,16 @@
 
 #include "gantry/network/PnicInfo.h"
 #include "gantry/network/PnicParams.h"
+#include "trellis/host/Transaction.h"
 #include "trellis/host/records/PnicRecord.h"
 
 namespace Trellis {
 namespace Network {
 namespace PnicDevice {
+
+// The stored NIC of that name; refuses an unknown one with "Physical NIC X
+// does not exist".
+Trellis::Host::PnicRecord RequireNic(Trellis::Host::Transaction const& t, std::string const& name);
 
 // "Physical NIC pnet0 " with the name as a message may show it.
 std::string Subject(Trellis::Host::PnicRecord const& nic);

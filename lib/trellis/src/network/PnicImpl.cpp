@@ -6,6 +6,7 @@
 
 #include "DVSwitchStore.h"
 #include "PnicDevice.h"
+#include "SwitchStore.h"
 #include "gantry/lib/GantryException.h"
 #include "host/StoredText.h"
 #include "trellis/host/Operation.h"
@@ -53,12 +54,6 @@ const Operation kRestartNegotiation("Pnic::RestartNegotiation");
 const Operation kIsValidPnic("PnicImpl::IsValidPnic");
 const Operation kGetUplinkPort("PnicImpl::GetUplinkPort");
 
-PnicRecord RequireNic(Transaction const& t, std::string const& name) {
-    std::optional<PnicRecord> nic = t.Find<PnicRecord>(name);
-    if (!nic) throw Gantry::Lib::GantryException("Physical NIC " + Trellis::Host::Printable(name) + " does not exist");
-    return std::move(*nic);
-}
-
 Gantry::Network::PnicRingParams RingsOf(Trellis::Host::PnicRingsRecord const& rings) {
     Gantry::Network::PnicRingParams params;
     params.mask = Gantry::Network::PnicRingParams::RX | Gantry::Network::PnicRingParams::RX_MINI |
@@ -83,14 +78,14 @@ PnicRecord const& PnicImpl::Answer(Operation const& operation) {
     if (snapshot_) {
         operation.Check();
     } else {
-        snapshot_ = std::make_unique<PnicRecord>(operation.Read([&](Transaction& t) { return RequireNic(t, name_); }));
+        snapshot_ = std::make_unique<PnicRecord>(operation.Read([&](Transaction& t) { return PnicDevice::RequireNic(t, name_); }));
     }
     return *snapshot_;
 }
 
 void PnicImpl::Change(Operation const& operation, std::function<void(PnicRecord&)> const& change) {
     PnicRecord changed = operation.Write([&](Transaction& t) {
-        PnicRecord nic = RequireNic(t, name_);
+        PnicRecord nic = PnicDevice::RequireNic(t, name_);
         change(nic);
         t.Put(nic);
         return nic;
@@ -229,17 +224,12 @@ void PnicImpl::RestartNegotiation() {
 
 PortImpl* PnicImpl::GetUplinkPort() {
     std::optional<Trellis::Host::PortRecord> port = kGetUplinkPort.Read([&](Transaction& t) {
-        std::optional<Trellis::Host::PortRecord> found;
         std::string vswitch;
         for (Trellis::Host::StandardSwitchRecord const& record : t.List<Trellis::Host::StandardSwitchRecord>())
             if (std::find(record.uplinks.begin(), record.uplinks.end(), name_) != record.uplinks.end())
                 vswitch = record.name;
         if (vswitch.empty()) vswitch = DVSwitchStore::SwitchOfNic(t, name_);
-        if (vswitch.empty()) return found;
-        for (Trellis::Host::PortRecord& record : t.ChildrenOf<Trellis::Host::PortRecord>(vswitch))
-            if (record.clientKind == Trellis::Host::PortClientKind::Uplink && record.clientName == name_)
-                found = std::move(record);
-        return found;
+        return vswitch.empty() ? std::nullopt : SwitchStore::UplinkPortOf(t, vswitch, name_);
     });
     if (!port)
         throw Gantry::Lib::GantryException("Physical NIC " + Trellis::Host::Printable(name_) +

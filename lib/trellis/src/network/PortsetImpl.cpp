@@ -1,5 +1,6 @@
 #include "trellis/network/PortsetImpl.h"
 
+#include <optional>
 #include <set>
 #include <utility>
 
@@ -29,8 +30,8 @@ const Trellis::Host::Operation kSetUplinkVlanStatsEnabled("PortsetImpl::SetUplin
 // The port of the NIC's uplink on the switch.
 Trellis::Host::PortRecord RequireUplinkPort(Trellis::Host::Transaction const& t, std::string const& vswitch,
                                             std::string const& nicName) {
-    for (Trellis::Host::PortRecord& port : t.ChildrenOf<Trellis::Host::PortRecord>(vswitch))
-        if (port.clientKind == Trellis::Host::PortClientKind::Uplink && port.clientName == nicName) return port;
+    std::optional<Trellis::Host::PortRecord> port = SwitchStore::UplinkPortOf(t, vswitch, nicName);
+    if (port) return std::move(*port);
     throw Gantry::Lib::GantryException("Physical NIC " + Trellis::Host::Printable(nicName) + " is no uplink of switch " +
                                        Trellis::Host::Printable(vswitch));
 }

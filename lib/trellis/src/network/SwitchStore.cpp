@@ -75,6 +75,12 @@ std::int64_t NewPortId(Transaction const& t) {
     return highest + 1;
 }
 
+std::optional<PortRecord> UplinkPortOf(Transaction const& t, std::string const& vswitch, std::string const& nic) {
+    for (PortRecord& port : t.ChildrenOf<PortRecord>(vswitch))
+        if (port.clientKind == Trellis::Host::PortClientKind::Uplink && port.clientName == nic) return std::move(port);
+    return std::nullopt;
+}
+
 void AddUplinkPort(Transaction& t, std::string const& vswitch, std::string const& nic) {
     PortRecord port;
     port.id = NewPortId(t);

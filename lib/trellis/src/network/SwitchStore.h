@@ -48,6 +48,10 @@ std::int64_t NewPortId(Trellis::Host::Transaction const& t);
 void AddUplinkPort(Trellis::Host::Transaction& t, std::string const& vswitch, std::string const& nic);
 void RemoveUplinkPorts(Trellis::Host::Transaction& t, std::string const& vswitch,
                        std::optional<std::string> const& nic);
+// The port of the NIC's uplink on the switch (standard or distributed), if
+// it has one.
+std::optional<Trellis::Host::PortRecord> UplinkPortOf(Trellis::Host::Transaction const& t, std::string const& vswitch,
+                                                      std::string const& nic);
 
 // The policies in force on a port group, read with its switch's.
 Trellis::Host::StoredPolicies PortGroupPolicies(Trellis::Host::Transaction const& t,
