@@ -7,7 +7,23 @@
 namespace Trellis {
 namespace Host {
 
+namespace {
+
+// Set before the library's first use. A command reads a handful of pages, so
+// the page cache takes them one by one instead of twenty at once, each
+// written to at its first use.
+void ConfigureLibrary() {
+    static bool const configured = [] {
+        sqlite3_config(SQLITE_CONFIG_PAGECACHE, nullptr, 0, 0);
+        return true;
+    }();
+    (void)configured;
+}
+
+}  // namespace
+
 Database::Database(const std::string& path, Mode mode) {
+    ConfigureLibrary();
     int flags = SQLITE_OPEN_NOMUTEX;
     switch (mode) {
         case Mode::ReadOnly: flags |= SQLITE_OPEN_READONLY; break;
