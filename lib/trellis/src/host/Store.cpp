@@ -61,9 +61,13 @@ Store::Store(std::string path, std::unique_ptr<Database> db)
 std::unique_ptr<Store> Store::Open(const std::string& path) {
     std::string file = std::filesystem::path(path).filename().string();
     if (file.empty() || file == "." || file == "..") Refuse(path, "the path names a directory, not a file");
-    RemoveAbandonedTemporaries(path);
     std::error_code error;
-    if (!std::filesystem::exists(path, error)) CreateHostFile(path);
+    // What a killed creator left is removed when the host is next created or
+    // replaced: an open of a host that exists writes nothing.
+    if (!std::filesystem::exists(path, error)) {
+        RemoveAbandonedTemporaries(path);
+        CreateHostFile(path);
+    }
     std::unique_ptr<Database> db;
     try {
         db = std::make_unique<Database>(path, Database::Mode::ReadWrite);

@@ -5,6 +5,7 @@
 
 #include <nlohmann/json.hpp>
 
+#include "host/HostCreation.h"
 #include "host/Store.h"
 #include "host/description/DescriptionIo.h"
 #include "host/description/ScaledDescription.h"
@@ -26,6 +27,7 @@ namespace {
 // The description was checked before the write lock is taken.
 void ImportParsed(const ParsedDescription& description) {
     Store& store = CurrentStore();
+    RemoveAbandonedTemporaries(store.Path());
     {
         TransactionScope scope(store, true);
         WriteDescription(scope.Get(), description);
