@@ -133,6 +133,14 @@ TEST(HostStore, MigratesAnOlderStoreInOneStep) {
     ASSERT_EQ(sqlite3_step(stmt), SQLITE_ROW);
     EXPECT_EQ(sqlite3_column_int(stmt, 0), LatestSchemaVersion());
     sqlite3_finalize(stmt);
+    // The index of kinds alone is gone: records of a kind are found through
+    // the index of (kind, name).
+    sqlite3_prepare_v2(db, "SELECT name FROM sqlite_master WHERE type = 'index' ORDER BY name", -1, &stmt, nullptr);
+    std::vector<std::string> indexes;
+    while (sqlite3_step(stmt) == SQLITE_ROW) indexes.push_back(reinterpret_cast<const char*>(sqlite3_column_text(stmt, 0)));
+    sqlite3_finalize(stmt);
+    EXPECT_EQ(indexes, (std::vector<std::string>{"records_by_parent", "sqlite_autoindex_faults_1",
+                                                 "sqlite_autoindex_records_1"}));
     sqlite3_close(db);
 
     // A second open finds nothing to do and seeds nothing twice.

@@ -69,9 +69,15 @@ std::string JsonReader::AsString() const {
     return text;
 }
 
+bool JsonReader::WasAskedFor(const char* key) const {
+    for (const char* used : used_)
+        if (used == key || std::strcmp(used, key) == 0) return true;
+    return false;
+}
+
 const Json* JsonReader::Find(const char* key) const {
     ExpectObject();
-    if (std::find(used_.begin(), used_.end(), key) == used_.end()) used_.push_back(key);
+    if (!WasAskedFor(key)) used_.push_back(key);
     auto it = value_->find(key);
     return it == value_->end() ? nullptr : &*it;
 }
@@ -170,7 +176,7 @@ std::vector<std::string> JsonReader::StringArray(const char* key) const {
 void JsonReader::RejectUnknownMembers() const {
     ExpectObject();
     for (auto it = value_->begin(); it != value_->end(); ++it)
-        if (std::find(used_.begin(), used_.end(), it.key()) == used_.end())
+        if (!WasAskedFor(it.key().c_str()))
             FailAt(Printable(it.key()), "unknown field");
 }
 

@@ -54,6 +54,8 @@ const std::vector<Migration>& Migrations() {
         {8, "name servers, connections, the host's own worlds and IPsec", [](Transaction& t) { MigrateToIpServices(t); }},
         {9, "the NICs' devices: PCI devices, link settings, diagnostics, counters, tuning and SR-IOV",
          [](Transaction& t) { MigrateToNicDevices(t); }},
+        // The change is the table layout's: the index of kinds alone goes.
+        {10, "the names of a kind read from the index of names, not from the records", [](Transaction&) {}},
     };
     return steps;
 }
@@ -74,8 +76,6 @@ void CreateBaseSchema(Database& db) {
                "  name TEXT NOT NULL,"
                "  data TEXT NOT NULL,"  // the record as JSON
                "  UNIQUE (kind, name));"
-               // Ordered by (kind, rowid): lists one kind in the order of first storing.
-               "CREATE INDEX records_by_kind ON records (kind);"
                "CREATE TABLE faults ("
                "  operation TEXT NOT NULL UNIQUE,"
                "  message TEXT,"
@@ -93,6 +93,10 @@ void UpgradeTableLayout(Database& db) {
     if (db.QueryInt("SELECT count(*) FROM pragma_table_info('records') WHERE name = 'parent'") == 0)
         db.Execute("ALTER TABLE records ADD COLUMN parent TEXT");  // the name of the object it belongs to
     db.Execute("CREATE INDEX IF NOT EXISTS records_by_parent ON records (kind, parent)");
+    // Records of one kind are found through the index of (kind, name), which
+    // also holds every name and rowid: listing the names of a kind reads no
+    // record, where an index of kinds alone made it read each one.
+    db.Execute("DROP INDEX IF EXISTS records_by_kind");
 }
 
 void SeedSection(Transaction& t, const char* key) {

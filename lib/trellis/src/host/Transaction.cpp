@@ -1,5 +1,7 @@
 #include "trellis/host/Transaction.h"
 
+#include <algorithm>
+#include <cstdint>
 #include <stdexcept>
 
 #include <nlohmann/json.hpp>
@@ -37,6 +39,21 @@ std::string StorableText(const std::string& kind, const std::string& name, const
                                        ": it holds text that is not valid UTF-8");
 }
 
+// Rows of one kind come in the order of their index; the rowid puts them in
+// the order of first storing. Sorting here costs less than SQLite's sorter,
+// which would copy every row, data and all, before giving the first.
+template <class Row>
+std::vector<Row> InStoringOrder(std::vector<std::pair<std::int64_t, Row>>& rows) {
+    std::sort(rows.begin(), rows.end(),
+              [](const std::pair<std::int64_t, Row>& a, const std::pair<std::int64_t, Row>& b) {
+                  return a.first < b.first;
+              });
+    std::vector<Row> ordered;
+    ordered.reserve(rows.size());
+    for (auto& row : rows) ordered.push_back(std::move(row.second));
+    return ordered;
+}
+
 }  // namespace
 
 void Transaction::MissingRecord(const std::string& kind, const std::string& name) {
@@ -58,14 +75,15 @@ std::optional<Json> Transaction::FindData(const std::string& kind, const std::st
 
 std::vector<std::pair<std::string, Json>> Transaction::ListData(const std::string& kind) const {
     return GuardedSql(store_, [&] {
-        std::vector<std::pair<std::string, Json>> records;
-        Statement query = store_.Db().Prepare("SELECT name, data FROM records WHERE kind = ? ORDER BY rowid");
+        std::vector<std::pair<std::int64_t, std::pair<std::string, Json>>> records;
+        Statement query = store_.Db().Prepare("SELECT rowid, name, data FROM records WHERE kind = ?");
         query.Bind(1, kind);
         while (query.Step()) {
-            std::string name = query.Text(0);
-            records.emplace_back(name, ParseStored(kind, name, query.Text(1)));
+            std::string name = query.Text(1);
+            Json data = ParseStored(kind, name, query.Text(2));
+            records.emplace_back(query.Int(0), std::make_pair(std::move(name), std::move(data)));
         }
-        return records;
+        return InStoringOrder(records);
     });
 }
 
@@ -95,6 +113,19 @@ std::size_t Transaction::CountChildrenWhere(const std::string& kind, const std::
     });
 }
 
+std::vector<std::string> Transaction::ChildrenTexts(const std::string& kind, const std::string& parent,
+                                                    const char* field) const {
+    return GuardedSql(store_, [&] {
+        std::vector<std::pair<std::int64_t, std::string>> texts;
+        Statement query = store_.Db().Prepare(
+            "SELECT rowid, json_extract(data, ?1) FROM records WHERE kind = ?2 AND parent = ?3 AND "
+            "json_type(data, ?1) = 'text'");
+        query.Bind(1, std::string("$.\"") + field + "\"").Bind(2, kind).Bind(3, parent);
+        while (query.Step()) texts.emplace_back(query.Int(0), query.Text(1));
+        return InStoringOrder(texts);
+    });
+}
+
 std::size_t Transaction::CountChildren(const std::string& kind, const std::string& parent) const {
     return GuardedSql(store_, [&] {
         Statement query = store_.Db().Prepare("SELECT count(*) FROM records WHERE kind = ? AND parent = ?");
@@ -106,11 +137,12 @@ std::size_t Transaction::CountChildren(const std::string& kind, const std::strin
 
 std::vector<std::string> Transaction::NamesOf(const std::string& kind) const {
     return GuardedSql(store_, [&] {
-        std::vector<std::string> names;
-        Statement query = store_.Db().Prepare("SELECT name FROM records WHERE kind = ? ORDER BY rowid");
+        // Read from the index of (kind, name) alone, which holds the rowids too.
+        std::vector<std::pair<std::int64_t, std::string>> names;
+        Statement query = store_.Db().Prepare("SELECT rowid, name FROM records WHERE kind = ?");
         query.Bind(1, kind);
-        while (query.Step()) names.push_back(query.Text(0));
-        return names;
+        while (query.Step()) names.emplace_back(query.Int(0), query.Text(1));
+        return InStoringOrder(names);
     });
 }
 

@@ -1,5 +1,6 @@
 #include "DVSwitchStore.h"
 
+#include <algorithm>
 #include <optional>
 
 #include "gantry/lib/GantryException.h"
@@ -25,10 +26,10 @@ std::vector<DVPortRecord> PortsOf(Transaction const& t, std::string const& dvswi
     return t.ChildrenOf<DVPortRecord>(dvswitch);
 }
 
+// A port holds its NIC's name only while a NIC is connected to it.
 std::vector<std::string> UplinksOf(Transaction const& t, std::string const& dvswitch) {
-    std::vector<std::string> nics;
-    for (DVPortRecord const& port : PortsOf(t, dvswitch))
-        if (!port.nic.empty()) nics.push_back(port.nic);
+    std::vector<std::string> nics = t.ChildrenTextsOf<DVPortRecord>(dvswitch, "nic");
+    nics.erase(std::remove(nics.begin(), nics.end(), std::string()), nics.end());
     return nics;
 }
 

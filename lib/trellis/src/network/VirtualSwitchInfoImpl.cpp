@@ -122,11 +122,15 @@ std::vector<Gantry::Network::DVSwitch*> VirtualSwitchInfoImpl::GetDVSwitches() {
 }
 
 std::vector<Gantry::Network::Portset*> VirtualSwitchInfoImpl::GetAllSwitches() {
+    // Handles, made from the names alone: callers go through every switch
+    // asking its name, and only the switch they are after is read in full.
     return kGetAllSwitches.Read([](Transaction& t) {
+        const int numPorts = Gantry::Network::Portset::DEF_NUM_PORTS;
         std::vector<Gantry::Network::Portset*> switches;
-        for (StandardSwitchRecord& record : t.List<StandardSwitchRecord>())
-            switches.push_back(new VirtualSwitchImpl(std::move(record)));
-        for (Gantry::Network::DVSwitch* dvs : DVSwitchesOf(t)) switches.push_back(dvs);
+        for (const std::string& name : t.Names<StandardSwitchRecord>())
+            switches.push_back(new VirtualSwitchImpl(name, numPorts));
+        for (const std::string& name : t.Names<Trellis::Host::DVSwitchRecord>())
+            switches.push_back(new DVSwitchImpl(name, numPorts));
         return switches;
     });
 }

@@ -91,10 +91,13 @@ private:
     [[noreturn]] void FailAt(const std::string& key, const std::string& problem) const;
     const Json& Required(const char* key) const;
     const Json* Find(const char* key) const;
+    bool WasAskedFor(const char* key) const;
 
     const Json* value_;
     std::shared_ptr<const Place> place_;
-    mutable std::vector<std::string> used_;
+    // The keys asked for, for RejectUnknownMembers: the callers' own texts,
+    // which live as long as the program (field names), so no copy is made.
+    mutable std::vector<const char*> used_;
 };
 
 // The word of an enum value from its table (see JsonReader::Word).

@@ -115,6 +115,15 @@ public:
         return CountChildrenWhere(R::kKind, parent, field, value);
     }
 
+    // The text of one stored field (a member of the record's JSON) of each
+    // child that has it as a text, in the order of List, read in the store
+    // without decoding the records.
+    template <class R>
+    std::vector<std::string> ChildrenTextsOf(const std::string& parent, const char* field) const {
+        static_assert(HasParent<R>::value, "the record type declares no Parent()");
+        return ChildrenTexts(R::kKind, parent, field);
+    }
+
     // Inserts the record, or replaces the one of the same name in its place.
     template <class R>
     void Put(const R& record) {
@@ -144,6 +153,8 @@ public:
     std::size_t CountOf(const std::string& kind) const;
     std::vector<std::pair<std::string, Json>> ChildrenData(const std::string& kind, const std::string& parent) const;
     std::size_t CountChildren(const std::string& kind, const std::string& parent) const;
+    std::vector<std::string> ChildrenTexts(const std::string& kind, const std::string& parent,
+                                           const char* field) const;
     std::size_t CountChildrenWhere(const std::string& kind, const std::string& parent, const char* field,
                                    const std::string& value) const;
     void PutData(const std::string& kind, const std::string& name, const Json& data,

@@ -29,8 +29,7 @@ void EraseHost(Transaction& t) {
 }
 
 const SectionType& TypeOf(const std::string& key) {
-    static const std::vector<SectionType> types = SectionTypes();
-    for (const SectionType& type : types)
+    for (const SectionType& type : SectionTypes())
         if (type.key == key) return type;
     throw std::logic_error("No description section \"" + key + "\"");
 }

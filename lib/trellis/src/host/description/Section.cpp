@@ -18,10 +18,15 @@ SectionRegistration::SectionRegistration(std::string key, int order, std::functi
     Registry().push_back({std::move(key), order, std::move(make)});
 }
 
-std::vector<SectionType> SectionTypes() {
-    std::vector<SectionType> types = Registry();
-    std::stable_sort(types.begin(), types.end(),
-                     [](const SectionType& a, const SectionType& b) { return a.order < b.order; });
+// Sorted once, at the first call, when every section has registered. Kept
+// for the program's life: readers hold on to the keys' texts.
+const std::vector<SectionType>& SectionTypes() {
+    static const std::vector<SectionType> types = [] {
+        std::vector<SectionType> sorted = Registry();
+        std::stable_sort(sorted.begin(), sorted.end(),
+                         [](const SectionType& a, const SectionType& b) { return a.order < b.order; });
+        return sorted;
+    }();
     return types;
 }
 

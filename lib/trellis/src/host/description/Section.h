@@ -65,7 +65,7 @@ public:
 };
 
 // Every registered section type, by order.
-std::vector<SectionType> SectionTypes();
+const std::vector<SectionType>& SectionTypes();
 
 // The sections of one description, each parsed.
 class ParsedDescription {
