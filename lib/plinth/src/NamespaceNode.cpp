@@ -48,9 +48,12 @@ std::vector<boost::shared_ptr<NamespaceNode> > NamespaceNode::GetNamespaceNodes(
     return children_;
 }
 
+// Children are compared by the name they were registered under, read in
+// place: asking each for a copy of it made the tree's building quadratic in
+// copies.
 boost::shared_ptr<NamespaceNode> NamespaceNode::GetNamespaceNode(std::string const& name) const {
     for (auto const& child : children_) {
-        if (child->GetName() == name) return child;
+        if (child->name_ == name) return child;
     }
     return boost::shared_ptr<NamespaceNode>();
 }
@@ -60,7 +63,7 @@ void NamespaceNode::RegisterNamespaceNode(boost::shared_ptr<NamespaceNode> node,
     node->SetName(name);
     node->SetParent(weak_from_this().lock());
     for (auto& child : children_) {
-        if (child->GetName() == name) {
+        if (child->name_ == name) {
             child = node;
             return;
         }
