@@ -77,7 +77,11 @@ std::unique_ptr<Store> Store::Open(const std::string& path) {
     std::unique_ptr<Store> store;
     try {
         db->SetBusyTimeout(kBusyTimeoutMs);
+        // The checks read in one transaction: one lock taken and given back
+        // instead of one for each. A refusal leaves it to the closing.
+        db->Execute("BEGIN");
         std::int64_t version = CheckIsHostStore(path, *db);
+        db->Execute("COMMIT");
         // A rollback journal, kept as an empty file between changes: reading
         // the host then writes nothing at all, where a write-ahead log would
         // create and remove its two files at every open.
@@ -120,8 +124,9 @@ void Store::Release() {
     faults_.SetHeld(false);
     GuardedSql(*this, [&] {
         db_->Execute("PRAGMA locking_mode = NORMAL");
-        // The lock goes at the next access to the file.
-        db_->QueryInt("SELECT count(*) FROM sqlite_master");
+        // The lock goes at the next access to the file: a read of a statement
+        // the open prepared already.
+        db_->QueryInt("PRAGMA user_version");
     });
 }
 
