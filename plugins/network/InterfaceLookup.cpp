@@ -3,8 +3,6 @@
 namespace KorvexCli {
 namespace NetworkNamespace {
 
-const char* const kInterfaceNamePattern = "tsl([0-9]|[1-9][0-9]|1[0-9][0-9]|2[0-4][0-9]|25[0-5])";
-
 std::unique_ptr<Gantry::Network::TslNic> FindInterface(Trellis::Network::TesselNicInfoImpl& nicInfo, Output& output,
                                                        std::string const& name) {
     std::unique_ptr<Gantry::Network::TslNic> nic(nicInfo.GetTesselNicByInterface(name, false));

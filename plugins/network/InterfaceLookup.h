@@ -11,7 +11,7 @@ namespace KorvexCli {
 namespace NetworkNamespace {
 
 // The form of an interface name that add and remove accept: tsl0 to tsl255.
-extern const char* const kInterfaceNamePattern;
+inline constexpr const char* kInterfaceNamePattern = "tsl([0-9]|[1-9][0-9]|1[0-9][0-9]|2[0-4][0-9]|25[0-5])";
 
 // The interface of that name; null after reporting "Unable to find a Tessel
 // interface with the name <name>". Host failures are thrown.

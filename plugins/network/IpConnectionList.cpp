@@ -19,8 +19,8 @@ namespace {
 
 using Gantry::Network::IpConnection;
 
-const Parameter kType = Parameter::String("type", "t", "Connection type : %ENUM%")
-                            .StringEnum({{"ip", ""}, {"tcp", ""}, {"udp", ""}, {"all", ""}});
+constexpr Parameter::Word kTypeWords[] = {{"ip", ""}, {"tcp", ""}, {"udp", ""}, {"all", ""}};
+const Parameter kType = Parameter::String("type", "t", "Connection type : %ENUM%").StringEnum(kTypeWords);
 
 // TCP's state codes 0 to 10; a code above them has no text.
 const char* const kStates[] = {"CLOSED",     "LISTEN",  "SYN_SENT", "RCVD",       "ESTABLISHED", "CLOSE_WAIT",

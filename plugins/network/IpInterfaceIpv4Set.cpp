@@ -20,13 +20,14 @@ const Parameter kInterfaceName =
                       "The name of the Tessel network interface to set IPv4 settings for. This name must be an "
                       "interface listed in the interface list command.")
         .Required();
+constexpr Parameter::Word kTypeWords[] = {
+    {"static", "Set Static IPv4 information for this interface. Requires --ipv4 and --netmask options."},
+    {"dhcp", "Use DHCP to aquire IPv4 setting for this interface."},
+    {"none", "Remove IPv4 settings form this interface."}};
 const Parameter kType =
     Parameter::String("type", "t", "IPv4 Address type : %FULLENUM%")
         .Required()
-        .StringEnum(
-            {{"static", "Set Static IPv4 information for this interface. Requires --ipv4 and --netmask options."},
-             {"dhcp", "Use DHCP to aquire IPv4 setting for this interface."},
-             {"none", "Remove IPv4 settings form this interface."}});
+        .StringEnum(kTypeWords);
 const Parameter kIpv4 = Parameter::String("ipv4", "I", "The static IPv4 address for this interface.");
 const Parameter kNetmask = Parameter::String("netmask", "N", "The static IPv4 netmask for this interface.");
 const Parameter kPeerDns = Parameter::Bool(

@@ -23,23 +23,26 @@ const Parameter kDestination =
                       "Ipv6 address of Security Association destination. Can be specified as 'any' or a correct IPv6 "
                       "address.")
         .Required();
+constexpr Parameter::Word kModeWords[] = {{"transport", ""}, {"tunnel", ""}};
 const Parameter kMode = Parameter::String("sa-mode", "m", "Security Association mode. Should be one in set %ENUM%.")
-                            .StringEnum({{"transport", ""}, {"tunnel", ""}});
+                            .StringEnum(kModeWords);
 const Parameter kSpi = Parameter::String("sa-spi", "p", "SPI value for the Security Association(hex).").Required();
+constexpr Parameter::Word kEncryptionAlgorithmWords[] = {{"null", ""}, {"3des-cbc", ""}, {"aes128-cbc", ""}};
 const Parameter kEncryptionAlgorithm =
     Parameter::String("encryption-algorithm", "e",
                       "Encryption algorithm for the Security Association. Should be one in set %ENUM%.")
         .Required()
-        .StringEnum({{"null", ""}, {"3des-cbc", ""}, {"aes128-cbc", ""}});
+        .StringEnum(kEncryptionAlgorithmWords);
 const Parameter kEncryptionKey =
     Parameter::String("encryption-key", "k",
                       "Encryption key(ASCII or hex). Length of hex key is dependent upon algorithm used. Required "
                       "when a encryption algorithm has been specified.");
+constexpr Parameter::Word kIntegrityAlgorithmWords[] = {{"hmac-sha1", ""}, {"hmac-sha2-256", ""}};
 const Parameter kIntegrityAlgorithm =
     Parameter::String("integrity-algorithm", "i",
                       "Integrity algorithm for the Security Association. Should be one in set %ENUM%.")
         .Required()
-        .StringEnum({{"hmac-sha1", ""}, {"hmac-sha2-256", ""}});
+        .StringEnum(kIntegrityAlgorithmWords);
 const Parameter kIntegrityKey =
     Parameter::String("integrity-key", "K",
                       "Integrity key(ASCII or hex). Length of hex key is dependent upon algorithm used.")

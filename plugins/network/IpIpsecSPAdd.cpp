@@ -28,21 +28,25 @@ const Parameter kDestination =
                       "Ipv6 address and prefix length of Security Policy destination. Can be specified as 'any' or a "
                       "correct Ipv6 network address.")
         .Required();
+constexpr Parameter::Word kModeWords[] = {{"transport", ""}, {"tunnel", ""}};
 const Parameter kMode = Parameter::String("sp-mode", "m", "Security Policy mode. Should be one in set %ENUM%.")
-                            .StringEnum({{"transport", ""}, {"tunnel", ""}});
+                            .StringEnum(kModeWords);
 const Parameter kSourcePort =
     Parameter::Int("source-port", "p", "Source Port for Security Policy. '0' stands for 'any'").Required();
 const Parameter kDestinationPort =
     Parameter::Int("destination-port", "P", "Destination Port for Security Policy. '0' stands for 'any'").Required();
+constexpr Parameter::Word kActionWords[] = {{"none", ""}, {"discard", ""}, {"ipsec", ""}};
 const Parameter kAction = Parameter::String("action", "A", "Action for Security Policy. Should be one in set %ENUM%.")
-                              .StringEnum({{"none", ""}, {"discard", ""}, {"ipsec", ""}});
+                              .StringEnum(kActionWords);
+constexpr Parameter::Word kProtocolWords[] = {{"any", ""}, {"tcp", ""}, {"udp", ""}, {"icmp6", ""}};
 const Parameter kProtocol =
     Parameter::String("upper-layer-protocol", "u",
                       "Upper layer protocol for Security Policy, Should be one in set %ENUM%.")
-        .StringEnum({{"any", ""}, {"tcp", ""}, {"udp", ""}, {"icmp6", ""}});
+        .StringEnum(kProtocolWords);
+constexpr Parameter::Word kDirectionWords[] = {{"in", ""}, {"out", ""}};
 const Parameter kDirection =
     Parameter::String("flow-direction", "w", "Flow direction for Security Policy. Should be one in set %ENUM%.")
-        .StringEnum({{"in", ""}, {"out", ""}});
+        .StringEnum(kDirectionWords);
 
 // The action under which a policy has a mode and an association.
 const char* const kIpsecAction = "ipsec";

@@ -16,10 +16,10 @@ namespace NetworkNamespace {
 
 namespace {
 
-const char* const kAllVersions = "all";
+constexpr const char* kAllVersions = "all";
 
-const Parameter kVersion =
-    Parameter::String("version", "v", "IP version : %ENUM%").StringEnum({{"4", ""}, {"6", ""}, {kAllVersions, ""}});
+constexpr Parameter::Word kVersionWords[] = {{"4", ""}, {"6", ""}, {kAllVersions, ""}};
+const Parameter kVersion = Parameter::String("version", "v", "IP version : %ENUM%").StringEnum(kVersionWords);
 const Parameter kInterfaceName =
     Parameter::String("interface-name", "i",
                       "The name of the Tessel network interface to limit the output of this command to; if "

@@ -17,8 +17,8 @@ namespace NetworkNamespace {
 
 namespace {
 
-const Parameter kVersion =
-    Parameter::String("version", "v", "IP version : %ENUM%").Required().StringEnum({{"4", ""}, {"6", ""}});
+constexpr Parameter::Word kVersionWords[] = {{"4", ""}, {"6", ""}};
+const Parameter kVersion = Parameter::String("version", "v", "IP version : %ENUM%").Required().StringEnum(kVersionWords);
 const Parameter kInterfaceName =
     Parameter::String("interface-name", "i",
                       "The name of the Tessel network interface to remove the neighbor entry from. If not "

@@ -2,7 +2,6 @@
 
 #include <memory>
 #include <string>
-#include <vector>
 
 #include "CommandSupport.h"
 #include "gantry/network/NetstackInstance.h"
@@ -14,6 +13,9 @@ namespace NetworkNamespace {
 
 namespace {
 
+using Plinth::CallSpec::CONSTRAINT_STRING_ENUM;
+using Plinth::CallSpec::ParameterConstraint;
+
 const Parameter kNetstack =
     Parameter::String("netstack", "N",
                       "The network stack instance. This name must be an interface listed in the netstack list command.")
@@ -23,7 +25,8 @@ const Parameter kName = Parameter::String("name", "n", "The name for this netsta
 const Parameter kMaxConn = Parameter::Int(
     "maxconn", "m",
     "The maximum number of connections for this netstack instance (applied only during netstack creation).");
-// Its choices are the host's algorithms, asked for each time the options are read.
+// Its choices are the host's algorithms, asked for each time the options are read
+// (GetInputSpecInternal sets them).
 const Parameter kCcAlgo = Parameter::String(
     "ccalgo", "c",
     "The TCP Congestion Contol Algorithm for this netstack instance (not applied to existing connections).: "
@@ -32,10 +35,10 @@ const Parameter kIpv6Enabled = Parameter::Bool(
     "ipv6enabled", "i", "To enable IPv6 for this netstack instance (aplied only during netstack creation).");
 
 // The host's algorithms, in its order, each with its help line.
-std::vector<Parameter::Word> AlgorithmChoices() {
-    std::vector<Parameter::Word> choices;
+boost::shared_ptr<ParameterConstraint> AlgorithmChoices() {
+    boost::shared_ptr<ParameterConstraint> choices = ParameterConstraint::New(CONSTRAINT_STRING_ENUM);
     for (std::string const& name : Trellis::Network::NetstackInstanceImpl::GetCongestionControlAlgorithmList())
-        choices.emplace_back(name, "Set " + name + " as the algorithm");
+        choices->AddStringEnum(name, "Set " + name + " as the algorithm");
     return choices;
 }
 
@@ -47,7 +50,10 @@ IpNetstackInstanceSet::IpNetstackInstanceSet() {
 }
 
 boost::shared_ptr<InputSpec> IpNetstackInstanceSet::GetInputSpecInternal() {
-    return InputSpecOf(kNetstack, kEnable, kName, kMaxConn, kCcAlgo.StringEnum(AlgorithmChoices()), kIpv6Enabled);
+    boost::shared_ptr<ParameterConstraint> algorithms = AlgorithmChoices();
+    boost::shared_ptr<InputSpec> inputSpec = InputSpecOf(kNetstack, kEnable, kName, kMaxConn, kCcAlgo, kIpv6Enabled);
+    inputSpec->FindByName(kCcAlgo)->SetConstraint(algorithms);
+    return inputSpec;
 }
 
 boost::shared_ptr<OutputSpec> IpNetstackInstanceSet::GetOutputSpecInternal() {

@@ -25,15 +25,13 @@ using Gantry::Network::DVSwitch;
 using Gantry::Network::LacpPortConfig;
 using Gantry::Network::NetworkFactory;
 
-const std::string kDvsName = "DVS Name";
-const std::string kLagName = "LAG Name";
-const std::string kLagId = "LAG ID";
-const std::string kNics = "NICs";
-const std::string kEnabled = "Enabled";
-const std::string kMode = "Mode";
-const std::string kLoadBalance = "Load balance";
-const std::string kLacpFields =
-    kDvsName + "," + kLagName + "," + kLagId + "," + kNics + "," + kEnabled + "," + kMode + "," + kLoadBalance;
+constexpr const char* kDvsName = "DVS Name";
+constexpr const char* kLagName = "LAG Name";
+constexpr const char* kLagId = "LAG ID";
+constexpr const char* kNics = "NICs";
+constexpr const char* kEnabled = "Enabled";
+constexpr const char* kMode = "Mode";
+constexpr const char* kLoadBalance = "Load balance";
 
 // The older LACP group of an uplink port group has no name of its own.
 const char* const kUplinkPortGroupLag = "default_uplink_pg_lag";
@@ -192,7 +190,8 @@ LacpGetConfig::LacpGetConfig() {
     SetDescription("Get LACP configuration on DVS");
     SetMetaDataField("type", "fetcher");
     SetDefaultOutputFormatter("table");
-    SetDefaultOutputParameter("fields:LACP", kLacpFields);
+    SetDefaultOutputParameter("fields:LACP", std::string(kDvsName) + "," + kLagName + "," + kLagId + "," + kNics + "," +
+                                                 kEnabled + "," + kMode + "," + kLoadBalance);
 }
 
 boost::shared_ptr<InputSpec> LacpGetConfig::GetInputSpecInternal() { return InputSpecOf(kLacpSwitchName); }

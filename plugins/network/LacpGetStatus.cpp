@@ -3,6 +3,7 @@
 #include <cstdint>
 #include <cstdio>
 #include <cstring>
+#include <iterator>
 #include <string>
 #include <vector>
 
@@ -18,37 +19,30 @@ using Gantry::Network::LacpGroup;
 using Gantry::Network::LacpNic;
 
 // LAG
-const std::string kDvSwitch = "DVSwitch";
-const std::string kLagId = "LAG ID";
-const std::string kMode = "Mode";
-const std::string kFlags = "Flags";
-const std::string kNicList = "Nic List";
+constexpr const char* kDvSwitch = "DVSwitch";
+constexpr const char* kLagId = "LAG ID";
+constexpr const char* kMode = "Mode";
+constexpr const char* kFlags = "Flags";
+constexpr const char* kNicList = "Nic List";
 // NicStatus
-const std::string kNic = "Nic";
-const std::string kState = "State";
-const std::string kLocalInformation = "Local Information";
-const std::string kPartnerInformation = "Partner Information";
+constexpr const char* kNic = "Nic";
+constexpr const char* kState = "State";
+constexpr const char* kLocalInformation = "Local Information";
+constexpr const char* kPartnerInformation = "Partner Information";
 // LocalInfo and PartnerInfo
-const std::string kPortState = "Port State";
-const std::string kAdminKey = "Admin Key";
-const std::string kOperKey = "Oper Key";
-const std::string kPortPriority = "Port Priority";
-const std::string kPortNumber = "Port Number";
-const std::string kDeviceId = "Device ID";
-const std::string kAge = "Age";
-
-const std::string kLagColumns = kDvSwitch + "," + kLagId + "," + kMode + "," + kFlags + "," + kNicList;
-const std::string kNicStatusColumns = kNic + "," + kState + "," + kLocalInformation + "," + kPartnerInformation;
-const std::string kLocalInfoColumns =
-    kPortState + "," + kFlags + "," + kAdminKey + "," + kOperKey + "," + kPortPriority + "," + kPortNumber;
-const std::string kPartnerInfoColumns = kDeviceId + "," + kPortState + "," + kFlags + "," + kAge + "," + kOperKey +
-                                        "," + kPortPriority + "," + kPortNumber;
+constexpr const char* kPortState = "Port State";
+constexpr const char* kAdminKey = "Admin Key";
+constexpr const char* kOperKey = "Oper Key";
+constexpr const char* kPortPriority = "Port Priority";
+constexpr const char* kPortNumber = "Port Number";
+constexpr const char* kDeviceId = "Device ID";
+constexpr const char* kAge = "Age";
 
 const char* const kSource = "plugins/network/LacpGetStatus";
 
 // What the letters of the flags mean, shown with every group whatever its
 // flags are.
-const std::vector<std::string> kFlagLegend = {
+constexpr const char* kFlagLegend[] = {
     "S - Device is sending Slow LACPDUs",
     "F - Device is sending fast LACPDUs",
     "A - Device is in active mode",
@@ -118,10 +112,15 @@ LacpGetStatus::LacpGetStatus() {
     SetDefaultOutputParameter("header:NicStatus", "<NONE>");
     SetDefaultOutputParameter("header:LocalInfo", "<NONE>");
     SetDefaultOutputParameter("header:PartnerInfo", "<NONE>");
-    SetDefaultOutputParameter("table-columns:LAG", kLagColumns);
-    SetDefaultOutputParameter("table-columns:NicStatus", kNicStatusColumns);
-    SetDefaultOutputParameter("table-columns:LocalInfo", kLocalInfoColumns);
-    SetDefaultOutputParameter("table-columns:PartnerInfo", kPartnerInfoColumns);
+    SetDefaultOutputParameter("table-columns:LAG",
+                              std::string(kDvSwitch) + "," + kLagId + "," + kMode + "," + kFlags + "," + kNicList);
+    SetDefaultOutputParameter("table-columns:NicStatus",
+                              std::string(kNic) + "," + kState + "," + kLocalInformation + "," + kPartnerInformation);
+    SetDefaultOutputParameter("table-columns:LocalInfo", std::string(kPortState) + "," + kFlags + "," + kAdminKey +
+                                                             "," + kOperKey + "," + kPortPriority + "," + kPortNumber);
+    SetDefaultOutputParameter("table-columns:PartnerInfo", std::string(kDeviceId) + "," + kPortState + "," + kFlags +
+                                                               "," + kAge + "," + kOperKey + "," + kPortPriority +
+                                                               "," + kPortNumber);
 }
 
 boost::shared_ptr<InputSpec> LacpGetStatus::GetInputSpecInternal() { return InputSpecOf(kLacpSwitchName); }
@@ -185,7 +184,7 @@ void LacpGetStatus::ExecuteInternal(boost::shared_ptr<Input> input, boost::share
                 lag->SetField(kDvSwitch, dvSwitch->GetName());
                 lag->SetField(kLagId, static_cast<long long>(group.lagId));
                 lag->SetField(kMode, group.mode == Gantry::Network::LACP_MODE_PASSIVE ? "Passive" : "Active");
-                lag->SetField(kFlags, kFlagLegend);
+                lag->SetField(kFlags, std::vector<std::string>(std::begin(kFlagLegend), std::end(kFlagLegend)));
                 boost::shared_ptr<MetaList> nics =
                     MetaList::New(Plinth::MetaObj::META_STRUCT, GetLACPNicInfoStruct());
                 for (LacpNic* nic : group.nics) nics->AddMetaStruct(NicStatusOf(*this, *nic));

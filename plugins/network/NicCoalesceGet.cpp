@@ -16,14 +16,14 @@ const Parameter kPnet = Parameter::String("pnet", "n", "The name of pnic to get 
 
 // The field titles, each spelt once. "TX Maximum frames" has its capital,
 // its RX twin none.
-const std::string kNic = "NIC";
-const std::string kRxUsecs = "RX microseconds";
-const std::string kRxMaxFrames = "RX maximum frames";
-const std::string kTxUsecs = "TX microseconds";
-const std::string kTxMaxFrames = "TX Maximum frames";
-const std::string kAdaptiveRx = "Adaptive RX";
-const std::string kAdaptiveTx = "Adaptive TX";
-const std::string kSampleInterval = "Sample interval seconds";
+constexpr const char* kNic = "NIC";
+constexpr const char* kRxUsecs = "RX microseconds";
+constexpr const char* kRxMaxFrames = "RX maximum frames";
+constexpr const char* kTxUsecs = "TX microseconds";
+constexpr const char* kTxMaxFrames = "TX Maximum frames";
+constexpr const char* kAdaptiveRx = "Adaptive RX";
+constexpr const char* kAdaptiveTx = "Adaptive TX";
+constexpr const char* kSampleInterval = "Sample interval seconds";
 
 // Capitalised, unlike the offloads' "on" and "off".
 std::string AdaptiveState(bool enabled) { return enabled ? "On" : "Off"; }
@@ -34,8 +34,8 @@ NicCoalesceGet::NicCoalesceGet() {
     SetDescription("Get coalesce parameters");
     SetMetaDataField("type", "fetcher");
     SetDefaultOutputFormatter("table");
-    SetDefaultOutputParameter("fields:CoalesceParams", kNic + "," + kRxUsecs + "," + kRxMaxFrames + "," + kTxUsecs +
-                                                           "," + kTxMaxFrames + "," + kAdaptiveRx + "," +
+    SetDefaultOutputParameter("fields:CoalesceParams", std::string(kNic) + "," + kRxUsecs + "," + kRxMaxFrames + "," +
+                                                           kTxUsecs + "," + kTxMaxFrames + "," + kAdaptiveRx + "," +
                                                            kAdaptiveTx + "," + kSampleInterval);
 }
 
@@ -47,7 +47,7 @@ boost::shared_ptr<OutputSpec> NicCoalesceGet::GetOutputSpecInternal() {
 
 boost::shared_ptr<MetaStruct> NicCoalesceGet::GetOutputStructure() {
     boost::shared_ptr<MetaStruct> result = MetaStruct::New("CoalesceParams");
-    for (std::string const& title :
+    for (const char* title :
          {kNic, kRxUsecs, kRxMaxFrames, kTxUsecs, kTxMaxFrames, kAdaptiveRx, kAdaptiveTx, kSampleInterval})
         result->SetField(title, MetaString::New());
     return result;

@@ -1,7 +1,9 @@
 #include "NicSet.h"
 
+#include <iterator>
 #include <memory>
 #include <string>
+#include <string_view>
 #include <vector>
 
 #include "CommandSupport.h"
@@ -16,7 +18,7 @@ namespace {
 const char* const kSource = "plugins/network/NicSet";
 
 // In the order of their port type values, 0 to 5.
-const std::vector<Parameter::Word> kPorts = {
+constexpr Parameter::Word kPorts[] = {
     {"tp", "Select TP (Twisted Pair) as the device port"},
     {"aui", "Select AUI (Attachment Unit Interface) as the device port"},
     {"bnc", "Select BNC (Bayonet Neill-Concelman) as the device port"},
@@ -24,17 +26,19 @@ const std::vector<Parameter::Word> kPorts = {
     {"fibre", "Select fibre as the device port"},
     {"da", "Select DA (Direct Attach copper) as the device port"}};
 // The wake-on letters, each at the index of its value.
-const std::string kWakeOnLetters = "pumbags";
+constexpr std::string_view kWakeOnLetters = "pumbags";
 
 const Parameter kPort =
     Parameter::String("port", "p", "Selects device port. Available device ports are %FULLENUM%").StringEnum(kPorts);
 const Parameter kPhyAddress = Parameter::Int64("phy-address", "P", "Set the PHY address of the device");
+constexpr Parameter::Word kTransceiverWords[] = {
+    {"internal", "Set the transceiver type to internal"},
+    {"external", "Set the transceiver type to external"}};
 const Parameter kTransceiver =
     Parameter::String("transceiver-type", "t",
                       "Selects transeiver type. Currently only internal and external can be specified, in the future "
                       "future types might be added. Available transeiver types are %FULLENUM%")
-        .StringEnum({{"internal", "Set the transceiver type to internal"},
-                     {"external", "Set the transceiver type to external"}});
+        .StringEnum(kTransceiverWords);
 // The pattern lets "d" through, which has no value: it is refused as an
 // invalid letter.
 const Parameter kWakeOnLan =
@@ -46,11 +50,15 @@ const Parameter kWakeOnLan =
         .Regex("[pumbagsd]+");
 const Parameter kMessageLevel =
     Parameter::Int64("message-level", "l", "Sets the driver message level. Meaning differ per driver.");
+constexpr long long kSpeedValues[] = {10, 100, 1000, 2500, 5000, 10000, 20000, 25000, 40000, 50000, 56000, 100000};
 const Parameter kSpeed =
     Parameter::Int("speed", "S", "The speed to set this NIC to, in Mbps. Acceptable values are :%ENUM%")
-        .IntEnum({10, 100, 1000, 2500, 5000, 10000, 20000, 25000, 40000, 50000, 56000, 100000});
+        .IntEnum(kSpeedValues);
+constexpr Parameter::Word kDuplexWords[] = {
+    {"full", "Set this nic to full duplex"},
+    {"half", "Set this nic to half duplex"}};
 const Parameter kDuplex = Parameter::String("duplex", "D", "The duplex to set this NIC to. Acceptable values are :%ENUM%")
-                              .StringEnum({{"full", "Set this nic to full duplex"}, {"half", "Set this nic to half duplex"}});
+                              .StringEnum(kDuplexWords);
 const Parameter kAuto = Parameter::Flag("auto", "a", "Set the speed and duplexity settings to autonegotiate.");
 
 [[noreturn]] void Refuse(std::string const& message, unsigned int line) {
@@ -64,8 +72,8 @@ bool FoldSettings(Input const& input, Gantry::Network::PnicInfo& info) {
     bool changed = false;
     if (input.HasParameter(kPort)) {
         std::string port = input.GetString(kPort);
-        for (int value = 0; value < static_cast<int>(kPorts.size()); ++value) {
-            if (kPorts[value].first != port) continue;
+        for (int value = 0; value < static_cast<int>(std::size(kPorts)); ++value) {
+            if (kPorts[value].value != port) continue;
             if (value != info.port) {
                 info.port = value;
                 info.portChanged = changed = true;
@@ -97,8 +105,8 @@ bool FoldSettings(Input const& input, Gantry::Network::PnicInfo& info) {
         info.wakeOnChanged = true;
         info.wakeOn.clear();
         for (char letter : input.GetString(kWakeOnLan)) {
-            std::string::size_type value = kWakeOnLetters.find(letter);
-            if (value == std::string::npos) Refuse("Invalid wol value.", __LINE__);
+            std::string_view::size_type value = kWakeOnLetters.find(letter);
+            if (value == std::string_view::npos) Refuse("Invalid wol value.", __LINE__);
             info.wakeOn.push_back(static_cast<int>(value));
         }
         changed = true;  // the set given counts as a change, the same as before or not

@@ -2,8 +2,6 @@
 
 #include <cstdint>
 #include <string>
-#include <utility>
-#include <vector>
 
 #include "CommandSupport.h"
 #include "gantry/network/PnicStats.h"
@@ -18,8 +16,14 @@ using Gantry::Network::PnicStats;
 
 const Parameter kNicName = Parameter::String("nic-name", "n", "Name of the NIC to get statistics from.").Required();
 
-// Each counter field of the result with its counter, in the structure's order.
-const std::vector<std::pair<const char*, std::uint64_t PnicStats::*>> kCounters = {
+// A counter field of the result with its counter.
+struct Counter {
+    const char* title;
+    std::uint64_t PnicStats::*counter;
+};
+
+// In the structure's order.
+constexpr Counter kCounters[] = {
     {"Packets received", &PnicStats::rxPackets},
     {"Packets sent", &PnicStats::txPackets},
     {"Bytes received", &PnicStats::rxBytes},

@@ -6,21 +6,24 @@
 namespace KorvexCli {
 namespace NetworkNamespace {
 
+constexpr Parameter::Word kLoadBalancingWords[] = {
+    {"portid", "Route based on the originating virtual port ID."},
+    {"iphash", "Route based on hashing the src and destination IP addresses"},
+    {"mac", "Route based on the MAC address of the packet source."},
+    {"explicit",
+     "Always use the highest order uplink from the list of active adapters which pass failover criteria."}};
 const Parameter kLoadBalancing =
     Parameter::String("load-balancing", "l",
                       "Set the load balancing policy for this policy. This can be one of the following options: "
                       "%FULLENUM%")
-        .StringEnum({{"portid", "Route based on the originating virtual port ID."},
-                     {"iphash", "Route based on hashing the src and destination IP addresses"},
-                     {"mac", "Route based on the MAC address of the packet source."},
-                     {"explicit",
-                      "Always use the highest order uplink from the list of active adapters which pass failover "
-                      "criteria."}});
+        .StringEnum(kLoadBalancingWords);
+constexpr Parameter::Word kFailureDetectionWords[] = {
+    {"link", "Detect failures based on the NIC link state"},
+    {"beacon", "Detect failures based on active beaconing to the vswitch"}};
 const Parameter kFailureDetection =
     Parameter::String("failure-detection", "f",
                       "Set the method of determining how a network outage is detected. %FULLENUM%")
-        .StringEnum({{"link", "Detect failures based on the NIC link state"},
-                     {"beacon", "Detect failures based on active beaconing to the vswitch"}});
+        .StringEnum(kFailureDetectionWords);
 const Parameter kNotifySwitches =
     Parameter::Bool("notify-switches", "n", "Indicate whether to send a notification to physical switches on failover");
 const Parameter kFailback = Parameter::Bool(

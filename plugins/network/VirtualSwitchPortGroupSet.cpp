@@ -13,10 +13,10 @@ using Gantry::Network::PortGroup;
 
 const Parameter kPortgroupName =
     Parameter::String("portgroup-name", "p", "The name of the port group to set vlan id for.").Required();
+// The help spells the bounds out; the assertion keeps them those of PortGroup.
+static_assert(PortGroup::MIN_VLAN_ID == 0 && PortGroup::MAX_VLAN_ID == 4095, "the vlan-id help names the range");
 const Parameter kVlanId =
-    Parameter::Int("vlan-id", "v",
-                   "The vlan id for this port group. This value is in the range (" +
-                       std::to_string(PortGroup::MIN_VLAN_ID) + " - " + std::to_string(PortGroup::MAX_VLAN_ID) + ")")
+    Parameter::Int("vlan-id", "v", "The vlan id for this port group. This value is in the range (0 - 4095)")
         .Range(PortGroup::MIN_VLAN_ID, PortGroup::MAX_VLAN_ID);
 
 }  // namespace

@@ -16,13 +16,15 @@ using Gantry::Network::CdpStatus;
 const Parameter kVswitchName =
     Parameter::String("vswitch-name", "v", "The name of virtual switch to apply the configurations.").Required();
 const Parameter kMtu = Parameter::Int("mtu", "m", "The MTU size of the given virtual switch.");
+constexpr Parameter::Word kCdpStatusWords[] = {
+    {"down", "CDP status is 'down'"},
+    {"listen", "CDP status is 'listen'"},
+    {"advertise", "CDP status is 'advertise'"},
+    {"both", "CDP status is 'both'"}};
 const Parameter kCdpStatus =
     Parameter::String("cdp-status", "c",
                       "The CDP status of the given virtual switch. It can be 'down', 'listen', 'advertise' or 'both'")
-        .StringEnum({{"down", "CDP status is 'down'"},
-                     {"listen", "CDP status is 'listen'"},
-                     {"advertise", "CDP status is 'advertise'"},
-                     {"both", "CDP status is 'both'"}});
+        .StringEnum(kCdpStatusWords);
 
 // Any word but the first three means both; the constraint lets only "both" through.
 CdpStatus CdpStatusOf(std::string const& word) {

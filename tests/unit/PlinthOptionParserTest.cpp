@@ -21,8 +21,10 @@ const Parameter kMtu = Parameter::Int("mtu", "m", "");
 const Parameter kEnabled = Parameter::Bool("enabled", "e", "");
 const Parameter kVerbose = Parameter::Flag("verbose", "v", "");
 const Parameter kPorts = Parameter::Int("ports", "", "").Range(1, 4096);
-const Parameter kSpeed = Parameter::Int("speed", "", "").IntEnum({10, 100});
-const Parameter kType = Parameter::String("type", "", "").StringEnum({{"static", ""}, {"dhcp", ""}});
+constexpr long long kSpeedValues[] = {10, 100};
+const Parameter kSpeed = Parameter::Int("speed", "", "").IntEnum(kSpeedValues);
+constexpr Parameter::Word kTypeWords[] = {{"static", ""}, {"dhcp", ""}};
+const Parameter kType = Parameter::String("type", "", "").StringEnum(kTypeWords);
 const Parameter kInterface = Parameter::String("interface", "", "").Regex("tsl[0-9]+");
 
 boost::shared_ptr<InputSpec> OptionsSpec() {
