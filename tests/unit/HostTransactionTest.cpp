@@ -166,7 +166,9 @@ TEST(HostTransaction, ReadingOneKindSeeksItsRecordsOnly) {
                             "SELECT data FROM records WHERE kind = ? AND name = ?",
                             "SELECT name, data FROM records WHERE kind = ? AND parent = ? ORDER BY rowid",
                             "SELECT rowid, json_extract(data, ?1) FROM records WHERE kind = ?2 AND parent = ?3 AND "
-                            "json_type(data, ?1) = 'text'"}) {
+                            "json_type(data, ?1) = 'text'",
+                            "SELECT rowid, json_extract(data, ?1), json_extract(data, ?2) FROM records WHERE kind = ?3 "
+                            "AND parent = ?4 AND json_type(data, ?1) = 'text' AND json_type(data, ?2) = 'text'"}) {
         SCOPED_TRACE(sql);
         sqlite3_stmt* plan = nullptr;
         ASSERT_EQ(sqlite3_prepare_v2(db, (std::string("EXPLAIN QUERY PLAN ") + sql).c_str(), -1, &plan, nullptr),

@@ -54,6 +54,11 @@ std::vector<Row> InStoringOrder(std::vector<std::pair<std::int64_t, Row>>& rows)
     return ordered;
 }
 
+// The JSON path of a top-level member, for SQLite's JSON functions.
+std::string MemberPath(const char* field) {
+    return std::string("$.\"") + field + "\"";
+}
+
 }  // namespace
 
 void Transaction::MissingRecord(const std::string& kind, const std::string& name) {
@@ -107,7 +112,7 @@ std::size_t Transaction::CountChildrenWhere(const std::string& kind, const std::
     return GuardedSql(store_, [&] {
         Statement query = store_.Db().Prepare(
             "SELECT count(*) FROM records WHERE kind = ? AND parent = ? AND json_extract(data, ?) = ?");
-        query.Bind(1, kind).Bind(2, parent).Bind(3, std::string("$.\"") + field + "\"").Bind(4, value);
+        query.Bind(1, kind).Bind(2, parent).Bind(3, MemberPath(field)).Bind(4, value);
         query.Step();
         return static_cast<std::size_t>(query.Int(0));
     });
@@ -120,9 +125,24 @@ std::vector<std::string> Transaction::ChildrenTexts(const std::string& kind, con
         Statement query = store_.Db().Prepare(
             "SELECT rowid, json_extract(data, ?1) FROM records WHERE kind = ?2 AND parent = ?3 AND "
             "json_type(data, ?1) = 'text'");
-        query.Bind(1, std::string("$.\"") + field + "\"").Bind(2, kind).Bind(3, parent);
+        query.Bind(1, MemberPath(field)).Bind(2, kind).Bind(3, parent);
         while (query.Step()) texts.emplace_back(query.Int(0), query.Text(1));
         return InStoringOrder(texts);
+    });
+}
+
+std::vector<std::pair<std::string, std::string>> Transaction::ChildrenTextPairs(const std::string& kind,
+                                                                                const std::string& parent,
+                                                                                const char* first,
+                                                                                const char* second) const {
+    return GuardedSql(store_, [&] {
+        std::vector<std::pair<std::int64_t, std::pair<std::string, std::string>>> pairs;
+        Statement query = store_.Db().Prepare(
+            "SELECT rowid, json_extract(data, ?1), json_extract(data, ?2) FROM records WHERE kind = ?3 AND "
+            "parent = ?4 AND json_type(data, ?1) = 'text' AND json_type(data, ?2) = 'text'");
+        query.Bind(1, MemberPath(first)).Bind(2, MemberPath(second)).Bind(3, kind).Bind(4, parent);
+        while (query.Step()) pairs.emplace_back(query.Int(0), std::make_pair(query.Text(1), query.Text(2)));
+        return InStoringOrder(pairs);
     });
 }
 

@@ -33,10 +33,12 @@ std::vector<std::string> UplinksOf(Transaction const& t, std::string const& dvsw
     return nics;
 }
 
+// A port on a distributed switch holds the id of its DVPort; the ports are
+// read in the store, not decoded, as there are many on a large host.
 std::map<std::string, std::vector<std::string>> ClientsByPort(Transaction const& t, std::string const& dvswitch) {
     std::map<std::string, std::vector<std::string>> clients;
-    for (Trellis::Host::PortRecord const& port : t.ChildrenOf<Trellis::Host::PortRecord>(dvswitch))
-        if (!port.dvPort.empty()) clients[port.dvPort].push_back(port.clientName);
+    for (auto& [dvPort, client] : t.ChildrenTextPairsOf<Trellis::Host::PortRecord>(dvswitch, "dvPort", "clientName"))
+        if (!dvPort.empty()) clients[dvPort].push_back(std::move(client));
     return clients;
 }
 

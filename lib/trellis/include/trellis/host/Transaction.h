@@ -124,6 +124,16 @@ public:
         return ChildrenTexts(R::kKind, parent, field);
     }
 
+    // The texts of two stored fields of each child that has both as texts,
+    // in the order of List, read in the store without decoding the records.
+    template <class R>
+    std::vector<std::pair<std::string, std::string>> ChildrenTextPairsOf(const std::string& parent,
+                                                                        const char* first,
+                                                                        const char* second) const {
+        static_assert(HasParent<R>::value, "the record type declares no Parent()");
+        return ChildrenTextPairs(R::kKind, parent, first, second);
+    }
+
     // Inserts the record, or replaces the one of the same name in its place.
     template <class R>
     void Put(const R& record) {
@@ -155,6 +165,9 @@ public:
     std::size_t CountChildren(const std::string& kind, const std::string& parent) const;
     std::vector<std::string> ChildrenTexts(const std::string& kind, const std::string& parent,
                                            const char* field) const;
+    std::vector<std::pair<std::string, std::string>> ChildrenTextPairs(const std::string& kind,
+                                                                       const std::string& parent, const char* first,
+                                                                       const char* second) const;
     std::size_t CountChildrenWhere(const std::string& kind, const std::string& parent, const char* field,
                                    const std::string& value) const;
     void PutData(const std::string& kind, const std::string& name, const Json& data,
