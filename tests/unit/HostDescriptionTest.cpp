@@ -54,6 +54,32 @@ TEST(HostDescription, ExportAfterImportGivesTheSameDocument) {
     EXPECT_EQ(ExportHost(), exported);
 }
 
+TEST(HostDescription, ObjectsKeepTheOrderOfTheirMembersThroughParsingAndChanges) {
+    // Keys out of alphabetical order, each with nested values, in an object
+    // that grows well past its first allocations while it is parsed.
+    std::string text = "{";
+    for (int i = 0; i < 40; ++i) {
+        const std::string n = std::to_string((i * 17) % 40);
+        text += (i ? "," : "") + ("\"k" + n + "\":") + "{\"list\":[" + n + ",{\"z\":\"" + n + "\",\"a\":[]}],\"n\":" + n + "}";
+    }
+    text += "}";
+    Json parsed = Json::parse(text);
+    EXPECT_EQ(parsed.dump(), text);
+    EXPECT_EQ(parsed.at("k34")["list"][1]["z"], "34");
+    Json copy = parsed;
+    copy.erase("k17");
+    copy["new"] = 1;
+    EXPECT_EQ(copy.size(), 40u);
+    EXPECT_EQ(copy.begin().key(), "k0");
+    EXPECT_EQ((++copy.begin()).key(), "k34");  // k17 stood between them
+    EXPECT_EQ(copy.back(), 1);
+    EXPECT_EQ(parsed.dump(), text);  // the copy is a copy
+
+    // Stored text with a key twice: the key keeps its first place and the
+    // last value, as ever (descriptions refuse it, see below).
+    EXPECT_EQ(Json::parse(R"({"a":1,"b":2,"a":3})").dump(), R"({"a":3,"b":2})");
+}
+
 TEST(HostDescription, BadDescriptionsAreRefusedWithTheirPathAndChangeNothing) {
     TempHost host([](Json& d) {
         d["exec"].push_back({{"commandLine", "/etc/init.d/xfrd restart"}, {"options", {false, true, false}}, {"status", 1}});

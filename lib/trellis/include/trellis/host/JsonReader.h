@@ -14,11 +14,13 @@
 
 #include <nlohmann/json_fwd.hpp>
 
+#include "trellis/host/JsonMembers.h"
+
 namespace Trellis {
 namespace Host {
 
 // Every JSON value of the host keeps the order of its members.
-using Json = nlohmann::ordered_json;
+using Json = nlohmann::basic_json<JsonMembers>;
 
 // A description or record that cannot be read. The text is "path: problem".
 class DescriptionError : public std::runtime_error {
