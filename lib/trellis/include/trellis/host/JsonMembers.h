@@ -117,8 +117,7 @@ struct JsonMembers : std::vector<std::pair<Key, T>> {
         for (; first != last; ++first) insert(*first);
     }
 
-private:
-    // The index of the member with the key; size() when there is none.
+    // The place of the member with the key; size() when there is none.
     size_type IndexOf(std::string_view key) const {
         const value_type* members = this->data();
         const size_type count = this->size();
