@@ -26,6 +26,7 @@
 #include "plinth/cli/Formatters.h"
 #include "plinth/cli/OptionParser.h"
 #include "plinth/metaobj/MetaObject.h"
+#include "trellis/host/JsonReader.h"
 
 struct CommandRun {
     std::vector<std::string> errors;
@@ -48,7 +49,7 @@ struct CommandRun {
     }
 
     // The result parsed back, for assertions on single fields.
-    nlohmann::ordered_json Parsed() const { return nlohmann::ordered_json::parse(Json()); }
+    Trellis::Host::Json Parsed() const { return Trellis::Host::Json::parse(Json()); }
 };
 
 // Runs the command on an Input built by hand, past the tool's checks: for

@@ -14,7 +14,7 @@
 
 namespace FirewallTest {
 
-using Json = nlohmann::ordered_json;
+using Json = Trellis::Host::Json;
 
 // The "firewall" section of the open host.
 inline Json Firewall() { return Json::parse(Trellis::Host::ExportHost())["firewall"]; }

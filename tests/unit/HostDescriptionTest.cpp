@@ -7,6 +7,7 @@
 #include "TempHost.h"
 #include "trellis/host/Description.h"
 #include "trellis/host/Faults.h"
+#include "trellis/host/JsonReader.h"
 
 using namespace Trellis::Host;
 using Json = TempHost::Json;
@@ -52,6 +53,55 @@ TEST(HostDescription, ExportAfterImportGivesTheSameDocument) {
     std::string exported = ExportHost();
     ImportHost(exported);
     EXPECT_EQ(ExportHost(), exported);
+}
+
+TEST(HostDescription, ObjectsKeepTheOrderOfTheirMembersThroughParsingAndChanges) {
+    // Keys out of alphabetical order, each with nested values, in an object
+    // that grows well past its first allocations while it is parsed.
+    std::string text = "{";
+    for (int i = 0; i < 40; ++i) {
+        const std::string n = std::to_string((i * 17) % 40);
+        text += (i ? "," : "") + ("\"k" + n + "\":") + "{\"list\":[" + n + ",{\"z\":\"" + n + "\",\"a\":[]}],\"n\":" + n + "}";
+    }
+    text += "}";
+    Json parsed = Json::parse(text);
+    EXPECT_EQ(parsed.dump(), text);
+    EXPECT_EQ(parsed.at("k34")["list"][1]["z"], "34");
+    Json copy = parsed;
+    copy.erase("k17");
+    copy["new"] = 1;
+    EXPECT_EQ(copy.size(), 40u);
+    EXPECT_EQ(copy.begin().key(), "k0");
+    EXPECT_EQ((++copy.begin()).key(), "k34");  // k17 stood between them
+    EXPECT_EQ(copy.back(), 1);
+    EXPECT_EQ(parsed.dump(), text);  // the copy is a copy
+
+    // Stored text with a key twice: the key keeps its first place and the
+    // last value, as ever (descriptions refuse it, see below).
+    EXPECT_EQ(Json::parse(R"({"a":1,"b":2,"a":3})").dump(), R"({"a":3,"b":2})");
+}
+
+TEST(HostDescription, AMemberNotAskedForIsRefusedWhereverItStands) {
+    // More members than a reader marks by their place alone.
+    Json object = Json::object();
+    std::vector<std::string> keys;
+    for (int i = 0; i < 70; ++i) keys.push_back("m" + std::to_string(i));
+    for (std::size_t i = 0; i < keys.size(); ++i) object[keys[i]] = i;
+    const auto unknownWhenSkipping = [&](std::size_t skipped) -> std::string {
+        JsonReader in(&object, "list[1]");
+        for (std::size_t i = 0; i < keys.size(); ++i)
+            if (i != skipped) in.Int(keys[i].c_str(), 0, 100);
+        in.Int("m68", 0, 100);  // asked twice
+        try {
+            in.RejectUnknownMembers();
+        } catch (const DescriptionError& e) {
+            return e.what();
+        }
+        return "";
+    };
+    EXPECT_EQ(unknownWhenSkipping(3), "list[1].m3: unknown field");
+    EXPECT_EQ(unknownWhenSkipping(66), "list[1].m66: unknown field");
+    EXPECT_EQ(unknownWhenSkipping(keys.size()), "");
 }
 
 TEST(HostDescription, BadDescriptionsAreRefusedWithTheirPathAndChangeNothing) {

@@ -15,7 +15,7 @@
 
 namespace InterfaceTest {
 
-using Json = nlohmann::ordered_json;
+using Json = Trellis::Host::Json;
 using Errors = std::vector<std::string>;
 
 // Adds a netstack instance in the kernel, without routes or connections.

@@ -16,7 +16,7 @@
 
 namespace SwitchTest {
 
-using Json = nlohmann::ordered_json;
+using Json = Trellis::Host::Json;
 
 inline Json Section(const std::string& key) { return Json::parse(Trellis::Host::ExportHost())[key]; }
 

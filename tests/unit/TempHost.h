@@ -20,10 +20,11 @@
 
 #include "trellis/host/Description.h"
 #include "trellis/host/HostSession.h"
+#include "trellis/host/JsonReader.h"
 
 class TempHost {
 public:
-    using Json = nlohmann::ordered_json;
+    using Json = Trellis::Host::Json;
 
     // The default host.
     TempHost() : TempHost(std::string()) {}

@@ -1,7 +1,6 @@
 #include "trellis/host/JsonReader.h"
 
 #include <algorithm>
-#include <cstring>
 
 #include <nlohmann/json.hpp>
 
@@ -10,31 +9,24 @@
 namespace Trellis {
 namespace Host {
 
-JsonReader::JsonReader(const Json* value, std::string path)
-    : value_(value), place_(std::make_shared<const Place>(Place{nullptr, std::move(path), 0})) {}
+JsonReader::JsonReader(const Json* value, std::string path) : value_(value), label_(std::move(path)) {}
 
-JsonReader::JsonReader(const Json* value, std::shared_ptr<const Place> place)
-    : value_(value), place_(std::move(place)) {}
+JsonReader::JsonReader(const Json* value, const char* kind, const std::string& name)
+    : value_(value), kind_(kind), name_(&name) {}
 
-JsonReader JsonReader::Child(const Json* value, const std::string& key) const {
-    return JsonReader(value, std::make_shared<const Place>(Place{place_, key, 0}));
-}
+JsonReader::JsonReader(const Json* value, const JsonReader* parent, const char* key, std::size_t index)
+    : value_(value), parent_(parent), key_(key), index_(index) {}
 
 std::string JsonReader::Path() const {
-    // The places from the top level down to this one.
-    std::vector<const Place*> chain;
-    for (const Place* place = place_.get(); place; place = place->parent.get()) chain.push_back(place);
     std::string path;
-    for (auto it = chain.rbegin(); it != chain.rend(); ++it) {
-        const Place& place = **it;
-        if (!place.parent) {
-            path = place.key;
-        } else if (place.key.empty()) {
-            path += "[" + std::to_string(place.index) + "]";
-        } else {
-            path += (path.empty() ? "" : ".") + place.key;
-        }
-    }
+    if (parent_)
+        path = parent_->Path();
+    else if (name_)
+        path = std::string(kind_) + " \"" + *name_ + "\"";
+    else
+        path = label_;
+    if (key_) path += (path.empty() ? "" : ".") + std::string(key_);
+    if (index_ != kNoIndex) path += "[" + std::to_string(index_) + "]";
     return path;
 }
 
@@ -69,17 +61,21 @@ std::string JsonReader::AsString() const {
     return text;
 }
 
-bool JsonReader::WasAskedFor(const char* key) const {
-    for (const char* used : used_)
-        if (used == key || std::strcmp(used, key) == 0) return true;
-    return false;
+bool JsonReader::WasAskedFor(std::size_t member) const {
+    if (member < kMarkedMembers) return (asked_ >> member) & 1;
+    return std::find(askedBeyond_.begin(), askedBeyond_.end(), member) != askedBeyond_.end();
 }
 
 const Json* JsonReader::Find(const char* key) const {
     ExpectObject();
-    if (!WasAskedFor(key)) used_.push_back(key);
-    auto it = value_->find(key);
-    return it == value_->end() ? nullptr : &*it;
+    const Json::object_t& members = *value_->get_ptr<const Json::object_t*>();
+    const std::size_t member = members.IndexOf(key);
+    if (member == members.size()) return nullptr;
+    if (member < kMarkedMembers)
+        asked_ |= std::uint64_t{1} << member;
+    else if (!WasAskedFor(member))
+        askedBeyond_.push_back(member);
+    return &members.data()[member].second;
 }
 
 const Json& JsonReader::Required(const char* key) const {
@@ -124,6 +120,19 @@ std::int64_t JsonReader::Int(const char* key, std::int64_t min, std::int64_t max
     return value;
 }
 
+namespace {
+
+// What Word expects, for its message: "a", "b" or "c".
+template <class Words>
+std::string Expected(const Words& words, std::size_t count) {
+    std::string expected;
+    for (std::size_t i = 0; i < count; ++i)
+        expected += (i == 0 ? "" : i + 1 == count ? " or " : ", ") + Quoted(words[i]);
+    return expected;
+}
+
+}  // namespace
+
 std::size_t JsonReader::Word(const char* key, const char* const* words, std::size_t count) const {
     const Json& member = Required(key);
     if (member.is_string()) {
@@ -131,40 +140,48 @@ std::size_t JsonReader::Word(const char* key, const char* const* words, std::siz
         for (std::size_t i = 0; i < count; ++i)
             if (text == words[i]) return i;
     }
-    std::string expected;
-    for (std::size_t i = 0; i < count; ++i)
-        expected += (i == 0 ? "" : i + 1 == count ? " or " : ", ") + Quoted(words[i]);
-    FailAt(key, "expected " + expected);
+    FailAt(key, "expected " + Expected(words, count));
 }
 
 std::size_t JsonReader::Word(const char* key, const std::vector<std::string>& words) const {
-    std::vector<const char*> pointers;
-    for (const std::string& word : words) pointers.push_back(word.c_str());
-    return Word(key, pointers.data(), pointers.size());
+    const Json& member = Required(key);
+    if (member.is_string()) {
+        const std::string& text = member.get_ref<const std::string&>();
+        for (std::size_t i = 0; i < words.size(); ++i)
+            if (text == words[i]) return i;
+    }
+    FailAt(key, "expected " + Expected(words, words.size()));
 }
 
 JsonReader JsonReader::Member(const char* key) const {
-    return Child(Find(key), key);
+    return JsonReader(Find(key), this, key, kNoIndex);
 }
 
 JsonReader JsonReader::Object(const char* key) const {
-    JsonReader member = Child(&Required(key), key);
+    JsonReader member(&Required(key), this, key, kNoIndex);
     member.ExpectObject();
     return member;
 }
 
-std::vector<JsonReader> JsonReader::Elements() const {
+std::vector<JsonReader> JsonReader::ElementsOf(const Json* value, const char* key) const {
     std::vector<JsonReader> elements;
-    if (!value_) return elements;
-    if (!value_->is_array()) Fail("expected an array");
-    elements.reserve(value_->size());
-    for (std::size_t i = 0; i < value_->size(); ++i)
-        elements.push_back(JsonReader(&(*value_)[i], std::make_shared<const Place>(Place{place_, "", i})));
+    if (!value) return elements;
+    if (!value->is_array()) {
+        if (key) FailAt(key, "expected an array");
+        Fail("expected an array");
+    }
+    const Json::array_t& array = *value->get_ptr<const Json::array_t*>();
+    elements.reserve(array.size());
+    for (std::size_t i = 0; i < array.size(); ++i) elements.push_back(JsonReader(&array[i], this, key, i));
     return elements;
 }
 
+std::vector<JsonReader> JsonReader::Elements() const {
+    return ElementsOf(value_, nullptr);
+}
+
 std::vector<JsonReader> JsonReader::Array(const char* key) const {
-    return Member(key).Elements();
+    return ElementsOf(Find(key), key);
 }
 
 std::vector<std::string> JsonReader::StringArray(const char* key) const {
@@ -175,9 +192,9 @@ std::vector<std::string> JsonReader::StringArray(const char* key) const {
 
 void JsonReader::RejectUnknownMembers() const {
     ExpectObject();
-    for (auto it = value_->begin(); it != value_->end(); ++it)
-        if (!WasAskedFor(it.key().c_str()))
-            FailAt(Printable(it.key()), "unknown field");
+    const Json::object_t& members = *value_->get_ptr<const Json::object_t*>();
+    for (std::size_t member = 0; member < members.size(); ++member)
+        if (!WasAskedFor(member)) FailAt(Printable(members.data()[member].first), "unknown field");
 }
 
 }  // namespace Host

@@ -14,11 +14,13 @@
 
 #include <nlohmann/json_fwd.hpp>
 
+#include "trellis/host/JsonMembers.h"
+
 namespace Trellis {
 namespace Host {
 
 // Every JSON value of the host keeps the order of its members.
-using Json = nlohmann::ordered_json;
+using Json = nlohmann::basic_json<JsonMembers>;
 
 // A description or record that cannot be read. The text is "path: problem".
 class DescriptionError : public std::runtime_error {
@@ -31,6 +33,9 @@ public:
     // value may be null: the reader then stands for a member that is absent.
     // path names where value stands, for messages ("" for the top level).
     JsonReader(const Json* value, std::string path);
+    // A stored record's: its path reads kind "name". kind is a text that
+    // lives as long as the program; name outlives the reader.
+    JsonReader(const Json* value, const char* kind, const std::string& name);
 
     bool IsPresent() const { return value_ != nullptr; }
     // Where the value stands, e.g. "firewall.rulesets[2].rules[0]". Built
@@ -76,28 +81,40 @@ public:
     // a misspelt key cannot pass unnoticed. Call it last.
     void RejectUnknownMembers() const;
 
-private:
-    // Where a reader's value stands: a member of, or an element of, the
-    // place of its parent; the top level has a label of its own.
-    struct Place {
-        std::shared_ptr<const Place> parent;
-        std::string key;      // the member's key, or the label of the top level
-        std::size_t index;    // the element's index, when key is empty and parent is not null
-    };
+    // The readers that Member, Object, Elements and Array return refer to
+    // the reader they came from, for their path: use them while it lives,
+    // as they are used while the JSON they read lives. The keys given to
+    // the calls above are the callers' own texts, which live as long as the
+    // program (field names): they are kept, not copied.
 
-    JsonReader(const Json* value, std::shared_ptr<const Place> place);
-    JsonReader Child(const Json* value, const std::string& key) const;
+private:
+    static constexpr std::size_t kNoIndex = static_cast<std::size_t>(-1);
+    static constexpr std::size_t kMarkedMembers = 64;
+
+    // A member (key) of the parent's value, an element (index) of it, or
+    // an element of a member (both).
+    JsonReader(const Json* value, const JsonReader* parent, const char* key, std::size_t index);
+    std::vector<JsonReader> ElementsOf(const Json* value, const char* key) const;
     std::string PathOf(const std::string& key) const;
     [[noreturn]] void FailAt(const std::string& key, const std::string& problem) const;
     const Json& Required(const char* key) const;
     const Json* Find(const char* key) const;
-    bool WasAskedFor(const char* key) const;
+    bool WasAskedFor(std::size_t member) const;
 
     const Json* value_;
-    std::shared_ptr<const Place> place_;
-    // The keys asked for, for RejectUnknownMembers: the callers' own texts,
-    // which live as long as the program (field names), so no copy is made.
-    mutable std::vector<const char*> used_;
+    // Where the value stands: below the parent's, or the top level, which
+    // has a label (or a record's kind and name) of its own.
+    const JsonReader* parent_ = nullptr;
+    const char* key_ = nullptr;
+    std::size_t index_ = kNoIndex;
+    std::string label_;
+    const char* kind_ = nullptr;
+    const std::string* name_ = nullptr;
+    // The members asked for, by their place in the object, for
+    // RejectUnknownMembers: a bit for each of the first ones, and the
+    // places of any beyond.
+    mutable std::uint64_t asked_ = 0;
+    mutable std::vector<std::size_t> askedBeyond_;
 };
 
 // The word of an enum value from its table (see JsonReader::Word).

@@ -181,7 +181,7 @@ private:
     template <class R>
     static R Decode(const Json& data, const std::string& name) {
         try {
-            return R::FromJson(JsonReader(&data, std::string(R::kKind) + " \"" + name + "\""));
+            return R::FromJson(JsonReader(&data, R::kKind, name));
         } catch (const DescriptionError& e) {
             throw Gantry::Lib::GantryException(std::string("The host store holds a damaged record: ") + e.what());
         }
